@@ -1,0 +1,57 @@
+# Helpers that keep every folder's CMakeLists.txt a short list.
+
+set(WEATHER_WARNINGS -Wall -Wextra)
+
+function(weather_add_subdirectory_if_exists dir)
+  if(EXISTS ${CMAKE_CURRENT_SOURCE_DIR}/${dir}/CMakeLists.txt)
+    add_subdirectory(${dir})
+  endif()
+endfunction()
+
+# Adds every direct subfolder of `dir` that has a CMakeLists.txt, so that
+# each area of a component owns its own list of sources.
+function(weather_add_area_subdirectories dir)
+  file(GLOB children LIST_DIRECTORIES true ${CMAKE_CURRENT_SOURCE_DIR}/${dir}/*)
+  list(SORT children)
+  foreach(child ${children})
+    if(IS_DIRECTORY ${child} AND EXISTS ${child}/CMakeLists.txt)
+      add_subdirectory(${child})
+    endif()
+  endforeach()
+endfunction()
+
+function(weather_apply_flags target)
+  target_compile_options(${target} PRIVATE ${WEATHER_WARNINGS})
+  if(WEATHER_SANITIZE)
+    target_compile_options(${target} PRIVATE -fsanitize=address,undefined -fno-omit-frame-pointer)
+    target_link_options(${target} PRIVATE -fsanitize=address,undefined)
+  endif()
+endfunction()
+
+# weather_add_library(name [SHARED|STATIC] SOURCES ... )
+function(weather_add_library name)
+  cmake_parse_arguments(ARG "SHARED;STATIC" "" "SOURCES" ${ARGN})
+  set(kind STATIC)
+  if(ARG_SHARED)
+    set(kind SHARED)
+  endif()
+  add_library(${name} ${kind} ${ARG_SOURCES})
+  set_target_properties(${name} PROPERTIES POSITION_INDEPENDENT_CODE ON)
+  weather_apply_flags(${name})
+endfunction()
+
+function(weather_add_executable name)
+  add_executable(${name} ${ARGN})
+  weather_apply_flags(${name})
+endfunction()
+
+# weather_add_test(name SOURCES ... LIBS ...): one GoogleTest binary,
+# each test registered with CTest on its own.
+function(weather_add_test name)
+  cmake_parse_arguments(ARG "" "" "SOURCES;LIBS" ${ARGN})
+  add_executable(${name} ${ARG_SOURCES})
+  weather_apply_flags(${name})
+  target_link_libraries(${name} PRIVATE ${ARG_LIBS} weather-test-support GTest::gmock GTest::gtest_main)
+  gtest_discover_tests(${name} DISCOVERY_TIMEOUT 60
+    PROPERTIES ENVIRONMENT "ECORE_NO_SYSTEM_MODULES=1;EINA_LOG_BACKTRACE=0;EINA_LOG_LEVELS=ecore_con:0;WEATHER_BUILD_DIR=${CMAKE_BINARY_DIR}")
+endfunction()

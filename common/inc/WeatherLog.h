@@ -1,0 +1,63 @@
+#ifndef NSWEATHER_WEATHER_LOG_H
+#define NSWEATHER_WEATHER_LOG_H
+
+#include <dlog.h>
+
+// Log lines of the suite: "<file>: <function>(<line>) > " and the text in
+// red, at error priority. Each component defines its own tag macros on top
+// of these (CommonLog.h, UICommonLog.h, WidgetLog.h).
+
+namespace NSWeather
+{
+constexpr const char* LogFileName(const char* path)
+{
+    const char* name = path;
+    for (const char* p = path; *p; ++p)
+        if (*p == '/')
+            name = p + 1;
+    return name;
+}
+}  // namespace NSWeather
+
+#define WEATHER_LOG_COLOR_BEGIN "\033[0;40;31m"
+#define WEATHER_LOG_COLOR_END "\033[0;m"
+
+#define WEATHER_LOG(tag, fmt, ...)                                                                  \
+    dlog_print(DLOG_ERROR, tag, "%s: %s(%d) > " WEATHER_LOG_COLOR_BEGIN fmt WEATHER_LOG_COLOR_END, \
+               NSWeather::LogFileName(__FILE__), __func__, __LINE__, ##__VA_ARGS__)
+
+// Guards log the failed condition as source text and leave at once.
+#define WEATHER_RETV_IF(tag, cond, value)                                           \
+    do                                                                              \
+    {                                                                               \
+        if (cond)                                                                   \
+        {                                                                           \
+            WEATHER_LOG(tag, "[%s(): %d] (%s) [return]", __func__, __LINE__, #cond); \
+            return value;                                                           \
+        }                                                                           \
+    } while (0)
+
+#define WEATHER_RET_IF(tag, cond)                                                   \
+    do                                                                              \
+    {                                                                               \
+        if (cond)                                                                   \
+        {                                                                           \
+            WEATHER_LOG(tag, "[%s(): %d] (%s) [return]", __func__, __LINE__, #cond); \
+            return;                                                                 \
+        }                                                                           \
+    } while (0)
+
+// Leaves the enclosing loop or switch; no do/while wrapper on purpose.
+#define WEATHER_BREAK_IF(tag, cond)                                                \
+    if (cond)                                                                      \
+    {                                                                              \
+        WEATHER_LOG(tag, "[%s(): %d] (%s) [break]", __func__, __LINE__, #cond);    \
+        break;                                                                     \
+    }
+
+// Logs the [break] line for a condition without leaving anything; for
+// steps that skip one action and go on.
+#define WEATHER_LOG_BREAK(tag, condText) \
+    WEATHER_LOG(tag, "[%s(): %d] (%s) [break]", __func__, __LINE__, condText)
+
+#endif

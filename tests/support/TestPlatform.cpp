@@ -1,0 +1,134 @@
+#include "TestPlatform.h"
+
+#include <cstdlib>
+#include <ftw.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+namespace WeatherTest
+{
+
+namespace
+{
+const char* const kSuiteApps[] = {"com.quorvex.weather-m", "com.quorvex.weather-m-agent",
+                                  "com.quorvex.weather-m-widget"};
+
+void MakeDirs(const std::string& path)
+{
+    for (size_t pos = path.find('/', 1); ; pos = path.find('/', pos + 1))
+    {
+        mkdir(path.substr(0, pos).c_str(), 0755);
+        if (pos == std::string::npos)
+            break;
+    }
+}
+
+int RemoveEntry(const char* path, const struct stat*, int, struct FTW*)
+{
+    // Tests may leave read-only folders behind; make them removable.
+    chmod(path, 0700);
+    return remove(path);
+}
+}  // namespace
+
+TestPlatformRoot::TestPlatformRoot()
+{
+    const char* tmp = getenv("TMPDIR");
+    std::string pattern = std::string(tmp && *tmp ? tmp : "/tmp") + "/weather-test-XXXXXX";
+    char* made = mkdtemp(&pattern[0]);
+    if (!made)
+        throw std::runtime_error("mkdtemp failed");
+    mPath = made;
+    if (const char* old = getenv("PLATFORM_ROOT"))
+    {
+        mHadOldRoot = true;
+        mOldRoot = old;
+    }
+    setenv("PLATFORM_ROOT", mPath.c_str(), 1);
+    for (const char* app : kSuiteApps)
+        RegisterApp(app);
+}
+
+TestPlatformRoot::~TestPlatformRoot()
+{
+    if (mHadOldRoot)
+        setenv("PLATFORM_ROOT", mOldRoot.c_str(), 1);
+    else
+        unsetenv("PLATFORM_ROOT");
+    // Fix permissions top-down first so that nftw can enter every folder.
+    nftw(mPath.c_str(), [](const char* p, const struct stat* st, int, struct FTW*) {
+        if (S_ISDIR(st->st_mode))
+            chmod(p, 0700);
+        return 0;
+    }, 16, FTW_PHYS);
+    nftw(mPath.c_str(), RemoveEntry, 16, FTW_DEPTH | FTW_PHYS);
+}
+
+std::string TestPlatformRoot::SharedDataDir() const
+{
+    return Path("apps/com.quorvex.weather-m/shared/data/");
+}
+
+void TestPlatformRoot::RegisterApp(const std::string& appId) const
+{
+    std::string dir = Path("apps/" + appId);
+    MakeDirs(dir + "/shared/data");
+    MakeDirs(dir + "/shared/res");
+    MakeDirs(dir + "/res");
+}
+
+LogCapture::LogCapture()
+{
+    dlog_set_capture(&LogCapture::CaptureCb, this);
+}
+
+LogCapture::~LogCapture()
+{
+    dlog_set_capture(nullptr, nullptr);
+}
+
+void LogCapture::CaptureCb(log_priority prio, const char* tag, const char* text, void* data)
+{
+    auto* self = static_cast<LogCapture*>(data);
+    std::lock_guard<std::mutex> lock(self->mMutex);
+    self->mLines.push_back({prio, tag, text});
+}
+
+std::vector<LogLine> LogCapture::GetLines() const
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    return mLines;
+}
+
+int LogCapture::Count(const std::string& part, const std::string& tag) const
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    int count = 0;
+    for (const LogLine& line : mLines)
+        if ((tag.empty() || line.tag == tag) && line.text.find(part) != std::string::npos)
+            ++count;
+    return count;
+}
+
+void LogCapture::Clear()
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    mLines.clear();
+}
+
+std::string LogCapture::Dump() const
+{
+    std::lock_guard<std::mutex> lock(mMutex);
+    std::string all;
+    for (const LogLine& line : mLines)
+        all += line.tag + ": " + line.text + "\n";
+    return all;
+}
+
+std::string BuildDir()
+{
+    const char* dir = getenv("WEATHER_BUILD_DIR");
+    return dir ? dir : ".";
+}
+
+}  // namespace WeatherTest
