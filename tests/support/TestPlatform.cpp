@@ -1,6 +1,7 @@
 #include "TestPlatform.h"
 
 #include <cstdlib>
+#include <stdexcept>
 #include <ftw.h>
 #include <sys/stat.h>
 #include <unistd.h>
@@ -75,6 +76,24 @@ void TestPlatformRoot::RegisterApp(const std::string& appId) const
     MakeDirs(dir + "/shared/data");
     MakeDirs(dir + "/shared/res");
     MakeDirs(dir + "/res");
+}
+
+void TestPlatformRoot::UseBuildResources() const
+{
+    for (const char* app : kSuiteApps)
+    {
+        for (const char* sub : {"/res", "/shared/res"})
+        {
+            std::string built = BuildDir() + "/res/" + app + sub;
+            std::string installed = Path(std::string("apps/") + app + sub);
+            struct stat st;
+            if (stat(built.c_str(), &st) != 0)
+                continue;
+            rmdir(installed.c_str());
+            if (symlink(built.c_str(), installed.c_str()) != 0)
+                throw std::runtime_error("cannot link " + installed);
+        }
+    }
 }
 
 LogCapture::LogCapture()

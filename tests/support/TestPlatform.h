@@ -28,6 +28,9 @@ public:
     // "<root>/apps/com.quorvex.weather-m/shared/data/"
     std::string SharedDataDir() const;
     void RegisterApp(const std::string& appId) const;
+    // Points each suite application's res/ and shared/res/ at the build
+    // tree's resource folders (<build>/res/<app id>/...), as an install would.
+    void UseBuildResources() const;
 
 private:
     std::string mPath;
