@@ -55,3 +55,11 @@ function(weather_add_test name)
   gtest_discover_tests(${name} DISCOVERY_TIMEOUT 60
     PROPERTIES ENVIRONMENT "ECORE_NO_SYSTEM_MODULES=1;EINA_LOG_BACKTRACE=0;EINA_LOG_LEVELS=ecore_con:0;WEATHER_BUILD_DIR=${CMAKE_BINARY_DIR}")
 endfunction()
+
+# weather_add_folder_test(name LIBS ...): one test binary of every .cpp in
+# the calling folder.
+function(weather_add_folder_test name)
+  cmake_parse_arguments(ARG "" "" "LIBS" ${ARGN})
+  file(GLOB sources CONFIGURE_DEPENDS ${CMAKE_CURRENT_SOURCE_DIR}/*.cpp)
+  weather_add_test(${name} SOURCES ${sources} LIBS ${ARG_LIBS})
+endfunction()
