@@ -1,0 +1,193 @@
+#include "DBConnector.h"
+
+#include <cstring>
+#include <unistd.h>
+
+#include "CommonLog.h"
+
+namespace NSWeather
+{
+
+namespace
+{
+constexpr int MAX_BUSY_RETRY = 10;
+constexpr useconds_t BUSY_WAIT_STEP_USEC = 100000;
+}  // namespace
+
+DBConnector* DBConnector::GetInstance()
+{
+    // Deliberately leaked: statements may still be finalised during exit.
+    static DBConnector* instance = new DBConnector();
+    return instance;
+}
+
+DBConnector::DBConnector() : mDBHandle(nullptr)
+{
+}
+
+DBConnector::~DBConnector()
+{
+    DBClose();
+}
+
+bool DBConnector::DBInitialize(const std::string& dbFilePath, bool isReadOnly)
+{
+    if (mDBHandle)
+    {
+        COMMON_LOG("DBInitialize is already called, mDBHandle is not NULL");
+        return true;
+    }
+    COMMON_RETV_IF(dbFilePath.empty(), false);
+    if (isReadOnly)
+        COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY) == false, false);
+    else
+        COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE) == false,
+                       false);
+    COMMON_RETV_IF(DBSetBusyHandler() == false, false);
+    COMMON_RETV_IF(DBExcutePerformanceOptimization() == false, false);
+    COMMON_RETV_IF(DBStartTransaction() == false, false);
+    return true;
+}
+
+void DBConnector::DBFinalize()
+{
+    COMMON_RET_IF(DBEndTransaction() == false);
+    if (!mDBHandle)
+    {
+        COMMON_LOG("mDBHandle is NULL");
+        return;
+    }
+    DBClose();
+}
+
+sqlite3_stmt* DBConnector::DBPrepareQuery(const char* query)
+{
+    if (!mDBHandle || !query)
+    {
+        COMMON_LOG("mDBHandle is NULL");
+        return nullptr;
+    }
+    sqlite3_stmt* stmt = nullptr;
+    int rc = sqlite3_prepare_v2(mDBHandle, query, static_cast<int>(strlen(query)), &stmt, nullptr);
+    if (rc != SQLITE_OK)
+    {
+        COMMON_LOG("Fail: sqlite3_prepare_v2 Failed rc [%d][%s]", rc, sqlite3_errmsg(mDBHandle));
+        COMMON_LOG("Query: %s", query);
+        sqlite3_finalize(stmt);
+        return nullptr;
+    }
+    return stmt;
+}
+
+bool DBConnector::DBExecuteQuery(const char* query)
+{
+    if (!mDBHandle || !query)
+    {
+        COMMON_LOG("mDBHandle is NULL");
+        return false;
+    }
+    char* errorMsg = nullptr;
+    int rc = sqlite3_exec(mDBHandle, query, nullptr, nullptr, &errorMsg);
+    if (rc == SQLITE_OK)
+    {
+        sqlite3_free(errorMsg);
+        return true;
+    }
+    if (errorMsg)
+    {
+        COMMON_LOG("Fail: sqlite3_exec Failed rc [%d][%s]", rc, errorMsg);
+        sqlite3_free(errorMsg);
+    }
+    return false;
+}
+
+int DBConnector::DBUtilBusyHandler(void* /*userData*/, int count)
+{
+    if (count >= MAX_BUSY_RETRY)
+    {
+        COMMON_LOG("Busy Handler will be returned SQLITE_BUSY error");
+        return 0;
+    }
+    COMMON_LOG("Busy Handler Called! : CNT(%d)\n", count + 1);
+    usleep(static_cast<useconds_t>(count + 1) * BUSY_WAIT_STEP_USEC);
+    return 1;
+}
+
+bool DBConnector::DBFileOpen(const std::string& dbFilePath, int openFlags)
+{
+    int rc = sqlite3_open_v2(dbFilePath.c_str(), &mDBHandle, openFlags, nullptr);
+    if (rc != SQLITE_OK)
+    {
+        COMMON_LOG("sqlite3_open_open failed. %d %p, %s", rc, static_cast<void*>(mDBHandle), dbFilePath.c_str());
+        DBClose();
+        return false;
+    }
+    return true;
+}
+
+bool DBConnector::DBSetBusyHandler()
+{
+    if (sqlite3_busy_handler(mDBHandle, DBUtilBusyHandler, nullptr) != SQLITE_OK)
+    {
+        COMMON_LOG("Fail to register busy handler");
+        DBClose();
+        return false;
+    }
+    return true;
+}
+
+// Durability is traded for speed; a failed step closes the connection so the
+// next cycle opens the file it asks for instead of reusing this one.
+bool DBConnector::DBExcutePerformanceOptimization()
+{
+    char* errorMsg = nullptr;
+    int rc = sqlite3_exec(mDBHandle, "PRAGMA synchronous=OFF; PRAGMA count_changes=OFF; PRAGMA temp_store=memory;",
+                          nullptr, nullptr, &errorMsg);
+    if (rc != SQLITE_OK)
+    {
+        COMMON_LOG("Fail to sqlite3_exec for performance optimization.");
+        COMMON_LOG("pszErrorMsg : %s", errorMsg ? errorMsg : "");
+        sqlite3_free(errorMsg);
+        DBClose();
+        return false;
+    }
+    return true;
+}
+
+bool DBConnector::DBStartTransaction()
+{
+    if (sqlite3_exec(mDBHandle, "BEGIN TRANSACTION;", nullptr, nullptr, nullptr) != SQLITE_OK)
+    {
+        COMMON_LOG("sqlite3_exec fail");
+        DBClose();
+        return false;
+    }
+    return true;
+}
+
+// A commit that fails (e.g. busy) is rolled back so that the handle is not
+// left open inside a transaction for the next cycle to inherit.
+bool DBConnector::DBEndTransaction()
+{
+    if (!mDBHandle)
+        return true;
+    if (sqlite3_exec(mDBHandle, "END TRANSACTION;", nullptr, nullptr, nullptr) != SQLITE_OK)
+    {
+        COMMON_LOG("sqlite3_exec fail");
+        sqlite3_exec(mDBHandle, "ROLLBACK;", nullptr, nullptr, nullptr);
+        DBClose();
+        return false;
+    }
+    return true;
+}
+
+void DBConnector::DBClose()
+{
+    if (!mDBHandle)
+        return;
+    // sqlite3_close_v2 defers the close if a statement were still alive.
+    sqlite3_close_v2(mDBHandle);
+    mDBHandle = nullptr;
+}
+
+}  // namespace NSWeather
