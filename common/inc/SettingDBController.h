@@ -1,0 +1,47 @@
+#ifndef NSWEATHER_SETTING_DB_CONTROLLER_H
+#define NSWEATHER_SETTING_DB_CONTROLLER_H
+
+#include <string>
+
+#include "QueryGenernator.h"
+#include "Setting.h"
+
+namespace NSWeather
+{
+
+class DBStatement;
+
+// The one settings row that the suite's processes share ("db/.setting.db").
+// Select, Update and UpdateLocationIdOfDisplayCity run their own cycle;
+// CreateTable, Insert and IsSettingTableExist run on the caller's.
+class SettingDBController
+{
+public:
+    SettingDBController();
+    virtual ~SettingDBController();
+
+    // Creates the table and the default row when either is missing.
+    // ERR_OK, or ERR_FAIL when the database cannot be opened.
+    int Initialize();
+    bool IsSettingTableExist();
+    void CreateTable();
+    void Insert(const SettingPtr& settingPtr);
+    // Rewrites the whole row from the record; a null record writes nothing.
+    void Update(const SettingPtr& settingPtr);
+    void UpdateLocationIdOfDisplayCity(const std::string& locationId);
+    // Null when there is no row or the database cannot be read.
+    SettingPtr Select();
+    // The settings row has had the same columns in every version.
+    void UpgradeDB(double currentVersion);
+
+private:
+    static void BindSetting(DBStatement& statement, const SettingPtr& settingPtr);
+    static SettingPtr ReadSetting(const DBStatement& statement);
+    SettingPtr SelectRow();
+
+    QueryGenernator mQueryGenernator;
+};
+
+}  // namespace NSWeather
+
+#endif

@@ -1,0 +1,132 @@
+#include "ShareTargetDBController.h"
+
+#include <cstdio>
+
+#include "CommonLog.h"
+#include "DBConnector.h"
+#include "DBStatement.h"
+#include "FileUtil.h"
+#include "WeatherDefine.h"
+
+namespace NSWeather
+{
+
+namespace
+{
+constexpr const char* SHARE_TARGET_TABLE = "SHARE_TARGET_TABLE";
+constexpr const char* SHARE_TARGET_CREATE_FORMAT =
+    "CREATE TABLE IF NOT EXISTS %s (PK_ID\tINTEGER NOT NULL PRIMARY KEY AUTOINCREMENT,AppID\tTEXT, PortID\tTEXT);";
+constexpr const char* SHARE_TARGET_SELECT_COLUMNS = "AppID,PortID";
+constexpr const char* SHARE_TARGET_INSERT_COLUMNS = "AppID, PortID";
+constexpr const char* SHARE_TARGET_PLACEHOLDERS = "?, ?";
+constexpr size_t CREATE_QUERY_BUFFER_SIZE = 1024;
+
+std::string GetShareTargetDataDBFilePath()
+{
+    return FileUtil::GetShareTargetDataDBFilePath();
+}
+}  // namespace
+
+ShareTargetDBController::ShareTargetDBController() = default;
+
+ShareTargetDBController::~ShareTargetDBController() = default;
+
+int ShareTargetDBController::Initialize()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetShareTargetDataDBFilePath(), false) == false, ERR_FAIL);
+    if (IsShareTargetTableExist() == false)
+        CreateTable();
+    dbConnector->DBFinalize();
+    return ERR_OK;
+}
+
+bool ShareTargetDBController::IsShareTargetTableExist()
+{
+    DBStatement statement(mQueryGenernator.MakeSelectQuery(SHARE_TARGET_TABLE, "COUNT(*)"));
+    int result = statement.Step();
+    if (result != SQLITE_ROW)
+    {
+        COMMON_LOG("No result : %d", result);
+        return false;
+    }
+    return statement.ColumnDouble(0) > 0;
+}
+
+void ShareTargetDBController::CreateTable()
+{
+    char query[CREATE_QUERY_BUFFER_SIZE] = {};
+    snprintf(query, sizeof(query), SHARE_TARGET_CREATE_FORMAT, SHARE_TARGET_TABLE);
+    DBConnector::GetInstance()->DBExecuteQuery(query);
+}
+
+void ShareTargetDBController::Insert(const ShareTargetPtr& shareTargetPtr)
+{
+    COMMON_RET_IF(!shareTargetPtr);
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RET_IF(dbConnector->DBInitialize(GetShareTargetDataDBFilePath(), false) == false);
+    // A scan that could not finish (busy, broken file) must not let a
+    // second row with the same id in.
+    int scanResult = SQLITE_DONE;
+    bool isStored = IsAppIdStored(shareTargetPtr->GetAppID(), scanResult);
+    if (isStored)
+        COMMON_LOG("There is a same appId. so we didn't insert this app");
+    else if (scanResult != SQLITE_DONE)
+        COMMON_LOG("Fail to read SHARE_TARGET_TABLE : %d", scanResult);
+    if (isStored || scanResult != SQLITE_DONE)
+    {
+        dbConnector->DBFinalize();
+        return;
+    }
+    {
+        DBStatement statement(mQueryGenernator.MakeInsertQuery(SHARE_TARGET_TABLE, SHARE_TARGET_INSERT_COLUMNS,
+                                                                SHARE_TARGET_PLACEHOLDERS));
+        statement.BindText(1, shareTargetPtr->GetAppID());
+        statement.BindText(2, shareTargetPtr->GetPortID());
+        statement.Step();
+    }
+    dbConnector->DBFinalize();
+}
+
+ShareTargetPtrVectorPtr ShareTargetDBController::Select()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetShareTargetDataDBFilePath(), true) == false, nullptr);
+    ShareTargetPtrVectorPtr shareTargetPtrVector = SelectRows();
+    dbConnector->DBFinalize();
+    return shareTargetPtrVector;
+}
+
+void ShareTargetDBController::UpgradeDB(double /*currentVersion*/)
+{
+}
+
+bool ShareTargetDBController::IsAppIdStored(const std::string& appId, int& stepResult)
+{
+    DBStatement statement(mQueryGenernator.MakeSelectQuery(SHARE_TARGET_TABLE, SHARE_TARGET_SELECT_COLUMNS));
+    while ((stepResult = statement.Step()) == SQLITE_ROW)
+    {
+        if (statement.ColumnText(0) == appId)
+            return true;
+    }
+    return false;
+}
+
+ShareTargetPtrVectorPtr ShareTargetDBController::SelectRows()
+{
+    auto shareTargetPtrVector = std::make_shared<ShareTargetPtrVector>();
+    DBStatement statement(mQueryGenernator.MakeSelectQuery(SHARE_TARGET_TABLE, SHARE_TARGET_SELECT_COLUMNS));
+    int result = statement.Step();
+    if (result != SQLITE_ROW)
+        COMMON_LOG("No result : %d", result);
+    for (; result == SQLITE_ROW; result = statement.Step())
+    {
+        auto shareTargetPtr = std::make_shared<ShareTarget>();
+        shareTargetPtr->SetAppID(statement.ColumnText(0));
+        shareTargetPtr->SetPortID(statement.ColumnText(1));
+        shareTargetPtrVector->push_back(shareTargetPtr);
+    }
+    return shareTargetPtrVector;
+}
+
+}  // namespace NSWeather

@@ -1,0 +1,99 @@
+#include "VersionDBController.h"
+
+#include <cstdio>
+
+#include "CommonLog.h"
+#include "DBConnector.h"
+#include "DBStatement.h"
+#include "FileUtil.h"
+#include "WeatherDefine.h"
+
+namespace NSWeather
+{
+
+namespace
+{
+constexpr const char* VERSION_TABLE = "VERSION_TABLE";
+constexpr const char* VERSION_CREATE_FORMAT = "CREATE TABLE IF NOT EXISTS %s (dbVersion DOUBLE);";
+constexpr double LATEST_DB_VERSION = 0.8;
+constexpr double NO_VERSION = -1.0;
+constexpr size_t CREATE_QUERY_BUFFER_SIZE = 1024;
+
+std::string GetVersionDBFilePath()
+{
+    return FileUtil::GetVersionDBFilePath();
+}
+}  // namespace
+
+VersionDBController::VersionDBController() = default;
+
+VersionDBController::~VersionDBController() = default;
+
+int VersionDBController::Initialize()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetVersionDBFilePath(), false) == false, ERR_FAIL);
+    CreateTable();
+    if (GetCurrentVersion() < 0)
+        Insert(0.0);
+    dbConnector->DBFinalize();
+    return ERR_OK;
+}
+
+double VersionDBController::GetCurrentDBVersion()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetVersionDBFilePath(), true) == false, 0.0);
+    double version = GetCurrentVersion();
+    dbConnector->DBFinalize();
+    return version;
+}
+
+double VersionDBController::GetCurrentVersion()
+{
+    DBStatement statement(mQueryGenernator.MakeSelectQuery(VERSION_TABLE, "dbVersion"));
+    int result = statement.Step();
+    if (result != SQLITE_ROW)
+    {
+        COMMON_LOG("No result : %d", result);
+        return NO_VERSION;
+    }
+    return statement.ColumnDouble(0);
+}
+
+double VersionDBController::GetLatestDBVersion() const
+{
+    return LATEST_DB_VERSION;
+}
+
+void VersionDBController::Insert(double version)
+{
+    DBStatement statement(mQueryGenernator.MakeInsertQuery(VERSION_TABLE, "dbVersion", "?"));
+    statement.BindDouble(1, version);
+    statement.Step();
+}
+
+void VersionDBController::Update(double version)
+{
+    DBStatement statement(mQueryGenernator.MakeUpdateQuery(VERSION_TABLE, "dbVersion = ?"));
+    statement.BindDouble(1, version);
+    statement.Step();
+}
+
+bool VersionDBController::UpgradeDB(double version)
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetVersionDBFilePath(), false) == false, false);
+    Update(version);
+    dbConnector->DBFinalize();
+    return true;
+}
+
+void VersionDBController::CreateTable()
+{
+    char query[CREATE_QUERY_BUFFER_SIZE] = {};
+    snprintf(query, sizeof(query), VERSION_CREATE_FORMAT, VERSION_TABLE);
+    DBConnector::GetInstance()->DBExecuteQuery(query);
+}
+
+}  // namespace NSWeather
