@@ -1,0 +1,316 @@
+// Local message ports: one Unix datagram socket per port, read on the
+// Ecore main loop.
+#include "message_port.h"
+
+#include <Ecore.h>
+#include <sys/socket.h>
+#include <sys/stat.h>
+#include <sys/un.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstdint>
+#include <cstdlib>
+#include <cstring>
+#include <map>
+#include <memory>
+#include <mutex>
+#include <string>
+
+#include "core/PlatformRoot.h"
+#include "dlog.h"
+#include "message_port/MessageEnvelope.h"
+
+namespace
+{
+
+const char* const kLogTag = "MESSAGE_PORT";
+const size_t kMaxMessageBytes = 16 * 1024;
+// The envelope adds base64 and the sender's names to the message.
+const size_t kMaxDatagramBytes = 64 * 1024;
+// Datagrams read per wake-up, so that a flood cannot starve the loop.
+const int kMaxReadsPerWake = 64;
+
+struct LocalPort
+{
+    int id = 0;
+    std::string name;
+    std::string path;
+    int fd = -1;
+    Ecore_Fd_Handler* handler = nullptr;
+    message_port_message_cb callback = nullptr;
+    void* userData = nullptr;
+};
+using LocalPortPtr = std::shared_ptr<LocalPort>;
+
+std::mutex gMutex;
+std::map<int, LocalPortPtr> gPorts;
+int gNextId = 1;
+
+LocalPortPtr FindPort(int id)
+{
+    std::lock_guard<std::mutex> lock(gMutex);
+    auto it = gPorts.find(id);
+    return it == gPorts.end() ? nullptr : it->second;
+}
+
+LocalPortPtr FindPortByName(const std::string& name)
+{
+    std::lock_guard<std::mutex> lock(gMutex);
+    for (auto& item : gPorts)
+        if (item.second->name == name)
+            return item.second;
+    return nullptr;
+}
+
+std::string PortDir()
+{
+    return platform::RootPath("run/msgport");
+}
+
+// False when the path does not fit a socket address.
+bool MakeAddress(const std::string& path, sockaddr_un& address)
+{
+    memset(&address, 0, sizeof(address));
+    address.sun_family = AF_UNIX;
+    if (path.size() >= sizeof(address.sun_path))
+        return false;
+    memcpy(address.sun_path, path.c_str(), path.size() + 1);
+    return true;
+}
+
+bool IsValidPortName(const char* name)
+{
+    return name && platform::IsSafeName(name) && strlen(name) <= 255;
+}
+
+void Deliver(const LocalPortPtr& port, const std::string& datagram)
+{
+    platform::MessageEnvelope envelope;
+    if (!platform::DecodeEnvelope(datagram, envelope))
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "dropped a malformed message of %zu bytes on port %s", datagram.size(),
+                   port->name.c_str());
+        return;
+    }
+    port->callback(port->id, envelope.senderAppId.c_str(),
+                   envelope.hasSenderPort ? envelope.senderPort.c_str() : nullptr, false, envelope.message,
+                   port->userData);
+    bundle_free(envelope.message);
+}
+
+// Returns false when nothing more is waiting (or the port went away).
+bool ReadOne(int id)
+{
+    LocalPortPtr port = FindPort(id);
+    if (!port)
+        return false;
+    std::string buffer(kMaxDatagramBytes, '\0');
+    ssize_t n = recv(port->fd, &buffer[0], buffer.size(), MSG_DONTWAIT | MSG_TRUNC);
+    if (n < 0)
+    {
+        if (errno != EAGAIN && errno != EWOULDBLOCK && errno != EINTR)
+            dlog_print(DLOG_ERROR, kLogTag, "recv on port %s failed (errno %d)", port->name.c_str(), errno);
+        return errno == EINTR;
+    }
+    if (static_cast<size_t>(n) > buffer.size())
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "dropped an oversized message of %zd bytes on port %s", n,
+                   port->name.c_str());
+        return true;
+    }
+    buffer.resize(static_cast<size_t>(n));
+    Deliver(port, buffer);
+    return true;
+}
+
+Eina_Bool PortReadableCb(void* data, Ecore_Fd_Handler*)
+{
+    try
+    {
+        int id = static_cast<int>(reinterpret_cast<intptr_t>(data));
+        for (int i = 0; i < kMaxReadsPerWake && ReadOne(id); ++i)
+        {
+        }
+    }
+    catch (...)
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "exception while delivering a message");
+    }
+    return ECORE_CALLBACK_RENEW;
+}
+
+// A socket file that still answers belongs to a live port of some process.
+bool IsLive(const sockaddr_un& address)
+{
+    int probe = socket(AF_UNIX, SOCK_DGRAM | SOCK_CLOEXEC, 0);
+    if (probe < 0)
+        return false;
+    bool live = connect(probe, reinterpret_cast<const sockaddr*>(&address), sizeof(address)) == 0;
+    close(probe);
+    return live;
+}
+
+int OpenPortSocket(const std::string& name, const std::string& path)
+{
+    sockaddr_un address;
+    if (!MakeAddress(path, address))
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "port path too long: %s", path.c_str());
+        return MESSAGE_PORT_ERROR_IO_ERROR;
+    }
+    if (IsLive(address))
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "port %s is held by another process", name.c_str());
+        return MESSAGE_PORT_ERROR_RESOURCE_UNAVAILABLE;
+    }
+    unlink(path.c_str());
+    int fd = socket(AF_UNIX, SOCK_DGRAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0);
+    if (fd < 0 || bind(fd, reinterpret_cast<const sockaddr*>(&address), sizeof(address)) != 0 ||
+        chmod(path.c_str(), 0600) != 0)
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "cannot open port %s (errno %d)", name.c_str(), errno);
+        if (fd >= 0)
+            close(fd);
+        return MESSAGE_PORT_ERROR_IO_ERROR;
+    }
+    return fd;
+}
+
+int AddPort(const char* name, message_port_message_cb callback, void* userData)
+{
+    if (!platform::MakeDirs(PortDir()) || chmod(PortDir().c_str(), 0700) != 0)
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "cannot create %s (errno %d)", PortDir().c_str(), errno);
+        return MESSAGE_PORT_ERROR_IO_ERROR;
+    }
+    auto port = std::make_shared<LocalPort>();
+    port->name = name;
+    port->path = PortDir() + "/" + port->name + ".sock";
+    port->fd = OpenPortSocket(port->name, port->path);
+    if (port->fd < 0)
+        return port->fd;
+    port->callback = callback;
+    port->userData = userData;
+    {
+        std::lock_guard<std::mutex> lock(gMutex);
+        port->id = gNextId++;
+        gPorts[port->id] = port;
+    }
+    ecore_init();
+    port->handler = ecore_main_fd_handler_add(port->fd, ECORE_FD_READ, PortReadableCb,
+                                              reinterpret_cast<void*>(static_cast<intptr_t>(port->id)), nullptr,
+                                              nullptr);
+    if (!port->handler)
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "cannot watch port %s", port->name.c_str());
+        ecore_shutdown();
+        message_port_unregister_local_port(port->id);
+        return MESSAGE_PORT_ERROR_IO_ERROR;
+    }
+    return port->id;
+}
+
+int MapSendError(int error, const char* port)
+{
+    dlog_print(DLOG_ERROR, kLogTag, "sending to port %s failed (errno %d)", port, error);
+    switch (error)
+    {
+    case ENOENT:
+    case ECONNREFUSED:
+        return MESSAGE_PORT_ERROR_PORT_NOT_FOUND;
+    case EAGAIN:
+    case ENOBUFS:
+        return MESSAGE_PORT_ERROR_RESOURCE_UNAVAILABLE;
+    case EMSGSIZE:
+        return MESSAGE_PORT_ERROR_MAX_EXCEEDED;
+    default:
+        return MESSAGE_PORT_ERROR_IO_ERROR;
+    }
+}
+
+int SendDatagram(const char* remotePort, const std::string& datagram)
+{
+    sockaddr_un address;
+    if (!MakeAddress(PortDir() + "/" + remotePort + ".sock", address))
+        return MESSAGE_PORT_ERROR_PORT_NOT_FOUND;
+    int fd = socket(AF_UNIX, SOCK_DGRAM | SOCK_CLOEXEC, 0);
+    if (fd < 0)
+        return MESSAGE_PORT_ERROR_IO_ERROR;
+    ssize_t sent = sendto(fd, datagram.data(), datagram.size(), MSG_DONTWAIT,
+                          reinterpret_cast<const sockaddr*>(&address), sizeof(address));
+    int error = errno;
+    close(fd);
+    if (sent == static_cast<ssize_t>(datagram.size()))
+        return MESSAGE_PORT_ERROR_NONE;
+    return MapSendError(sent < 0 ? error : EMSGSIZE, remotePort);
+}
+
+int Send(const char* remoteAppId, const char* remotePort, bundle* message, const char* localPort)
+{
+    if (!remoteAppId || !*remoteAppId || !IsValidPortName(remotePort) || !message)
+        return MESSAGE_PORT_ERROR_INVALID_PARAMETER;
+    bundle_raw* raw = nullptr;
+    int length = 0;
+    if (bundle_encode(message, &raw, &length) != BUNDLE_ERROR_NONE)
+        return MESSAGE_PORT_ERROR_OUT_OF_MEMORY;
+    free(raw);
+    if (static_cast<size_t>(length) > kMaxMessageBytes)
+        return MESSAGE_PORT_ERROR_MAX_EXCEEDED;
+    std::string datagram = platform::EncodeEnvelope(platform::OwnAppId(), localPort, message);
+    return SendDatagram(remotePort, datagram);
+}
+
+}  // namespace
+
+extern "C" int message_port_register_local_port(const char* localPort, message_port_message_cb callback,
+                                                void* userData)
+{
+    if (!IsValidPortName(localPort) || !callback)
+        return MESSAGE_PORT_ERROR_INVALID_PARAMETER;
+    if (LocalPortPtr existing = FindPortByName(localPort))
+    {
+        std::lock_guard<std::mutex> lock(gMutex);
+        existing->callback = callback;
+        existing->userData = userData;
+        return existing->id;
+    }
+    return AddPort(localPort, callback, userData);
+}
+
+extern "C" int message_port_unregister_local_port(int localPortId)
+{
+    if (localPortId <= 0)
+        return MESSAGE_PORT_ERROR_INVALID_PARAMETER;
+    LocalPortPtr port;
+    {
+        std::lock_guard<std::mutex> lock(gMutex);
+        auto it = gPorts.find(localPortId);
+        if (it == gPorts.end())
+            return MESSAGE_PORT_ERROR_PORT_NOT_FOUND;
+        port = it->second;
+        gPorts.erase(it);
+    }
+    if (port->handler)
+    {
+        ecore_main_fd_handler_del(port->handler);
+        ecore_shutdown();
+    }
+    close(port->fd);
+    unlink(port->path.c_str());
+    return MESSAGE_PORT_ERROR_NONE;
+}
+
+extern "C" int message_port_send_message(const char* remoteAppId, const char* remotePort, bundle* message)
+{
+    return Send(remoteAppId, remotePort, message, nullptr);
+}
+
+extern "C" int message_port_send_message_with_local_port(const char* remoteAppId, const char* remotePort,
+                                                         bundle* message, int localPortId)
+{
+    LocalPortPtr local = FindPort(localPortId);
+    if (!local)
+        return MESSAGE_PORT_ERROR_INVALID_PARAMETER;
+    return Send(remoteAppId, remotePort, message, local->name.c_str());
+}
