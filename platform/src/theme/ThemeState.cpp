@@ -1,0 +1,354 @@
+#include "theme/ThemeState.h"
+
+#include <Edje.h>
+#include <Elementary.h>
+
+#include <algorithm>
+#include <cstring>
+#include <memory>
+
+#include "core/PlatformRoot.h"
+#include "dlog.h"
+
+namespace platform
+{
+namespace theme
+{
+
+namespace
+{
+const char* const LOG_TAG = "platform-theme";
+const char* const PRESSED_SUFFIX = "_press";
+// Table files are a few kilobytes; anything far larger is not a table.
+const size_t MAX_TABLE_BYTES = 1024 * 1024;
+
+int ReadTable(const char* path, std::string& xml)
+{
+    if (!path || !*path)
+        return UXT_THEME_ERROR_INVALID_PARAMETER;
+    if (!ReadFile(path, xml))
+    {
+        dlog_print(DLOG_ERROR, LOG_TAG, "cannot read theme table %s", path);
+        return UXT_THEME_ERROR_IO_ERROR;
+    }
+    if (xml.size() > MAX_TABLE_BYTES)
+    {
+        dlog_print(DLOG_ERROR, LOG_TAG, "theme table %s is too large (%zu bytes)", path, xml.size());
+        return UXT_THEME_ERROR_NO_DATA;
+    }
+    return UXT_THEME_ERROR_NONE;
+}
+
+void SetColorClass(const std::string& name, const Rgba& c, const Rgba& o, const Rgba& s)
+{
+    edje_color_class_set(name.c_str(), c.r, c.g, c.b, c.a, o.r, o.g, o.b, o.a, s.r, s.g, s.b, s.a);
+}
+
+const char* StyleName(uxt_theme_style_e style)
+{
+    switch (style)
+    {
+        case UXT_THEME_STYLE_DARK:
+            return "dark";
+        case UXT_THEME_STYLE_LIGHT:
+            return "light";
+        default:
+            return "";
+    }
+}
+
+Evas_Object* EdjeOf(Evas_Object* obj)
+{
+    const char* type = evas_object_type_get(obj);
+    if (type && strcmp(type, "edje") == 0)
+        return obj;
+    if (!elm_object_widget_check(obj))
+        return nullptr;
+    return elm_layout_edje_get(obj);
+}
+}  // namespace
+
+ThemeState& ThemeState::GetInstance()
+{
+    static ThemeState state;
+    return state;
+}
+
+int ThemeState::SetEnabled(bool enabled)
+{
+    if (mIsEnabled && !enabled)
+    {
+        ClearAppliedColors();
+        ClearAppliedFonts();
+    }
+    mIsEnabled = enabled;
+    return UXT_THEME_ERROR_NONE;
+}
+
+uxt_theme_color_table_h ThemeState::AddColorTable(const char* path)
+{
+    std::string xml;
+    int ret = ReadTable(path, xml);
+    auto table = std::make_unique<_uxt_theme_color_table>();
+    if (ret == UXT_THEME_ERROR_NONE)
+        ret = ParseColorTable(xml, *table);
+    set_last_result(ret);
+    if (ret != UXT_THEME_ERROR_NONE)
+        return nullptr;
+    mColorTables.insert(table.get());
+    return table.release();
+}
+
+int ThemeState::DeleteColorTable(uxt_theme_color_table_h table)
+{
+    if (!mColorTables.erase(table))
+        return UXT_THEME_ERROR_INVALID_PARAMETER;
+    if (mCurrentColorTable == table)
+        mCurrentColorTable = nullptr;
+    delete table;
+    return UXT_THEME_ERROR_NONE;
+}
+
+int ThemeState::SetColorTable(uxt_theme_color_table_h table)
+{
+    if (!mColorTables.count(table))
+        return UXT_THEME_ERROR_INVALID_PARAMETER;
+    if (!mIsEnabled)
+        return UXT_THEME_ERROR_INVALID_OPERATION;
+    mCurrentColorTable = table;
+    ApplyColors(*table);
+    return UXT_THEME_ERROR_NONE;
+}
+
+uxt_theme_font_table_h ThemeState::AddFontTable(const char* path)
+{
+    std::string xml;
+    int ret = ReadTable(path, xml);
+    auto table = std::make_unique<_uxt_theme_font_table>();
+    if (ret == UXT_THEME_ERROR_NONE)
+        ret = ParseFontTable(xml, *table);
+    set_last_result(ret);
+    if (ret != UXT_THEME_ERROR_NONE)
+        return nullptr;
+    mFontTables.insert(table.get());
+    return table.release();
+}
+
+int ThemeState::DeleteFontTable(uxt_theme_font_table_h table)
+{
+    if (!mFontTables.erase(table))
+        return UXT_THEME_ERROR_INVALID_PARAMETER;
+    if (mCurrentFontTable == table)
+        mCurrentFontTable = nullptr;
+    delete table;
+    return UXT_THEME_ERROR_NONE;
+}
+
+int ThemeState::SetFontTable(uxt_theme_font_table_h table)
+{
+    if (!mFontTables.count(table))
+        return UXT_THEME_ERROR_INVALID_PARAMETER;
+    if (!mIsEnabled)
+        return UXT_THEME_ERROR_INVALID_OPERATION;
+    mCurrentFontTable = table;
+    ApplyFonts(*table);
+    return UXT_THEME_ERROR_NONE;
+}
+
+int ThemeState::SetStyle(int style)
+{
+    if (style < UXT_THEME_STYLE_DEFAULT || style > UXT_THEME_STYLE_LIGHT)
+        return UXT_THEME_ERROR_INVALID_PARAMETER;
+    mStyle = static_cast<uxt_theme_style_e>(style);
+    if (mIsEnabled && mCurrentColorTable)
+        ApplyColors(*mCurrentColorTable);
+    if (mIsEnabled && mCurrentFontTable)
+        ApplyFonts(*mCurrentFontTable);
+    return UXT_THEME_ERROR_NONE;
+}
+
+const ThemeSection* ThemeState::ChooseSection(const _uxt_theme_color_table& table) const
+{
+    if (table.sections.empty())
+        return nullptr;
+    auto begin = table.sections.begin();
+    auto end = table.sections.end();
+    auto found = end;
+    if (mStyle != UXT_THEME_STYLE_DEFAULT)
+    {
+        std::string wanted = StyleName(mStyle);
+        found = std::find_if(begin, end, [&](const ThemeSection& s) { return s.style == wanted; });
+    }
+    int themeId = 0;
+    if (found == end && vconf_get_int(UXT_THEME_KEY_THEME, &themeId) == VCONF_OK)
+        found = std::find_if(begin, end, [&](const ThemeSection& s) { return s.id == themeId; });
+    return found == end ? &table.sections.front() : &*found;
+}
+
+void ThemeState::ApplyColors(const _uxt_theme_color_table& table)
+{
+    const ThemeSection* section = ChooseSection(table);
+    if (!section)
+        return;
+    for (const auto& [code, color] : section->colors)
+    {
+        SetColorClass(code, color.normal, color.outline, color.shadow);
+        if (color.hasPressed)
+            SetColorClass(code + PRESSED_SUFFIX, color.pressed, color.outline, color.shadow);
+        else if (mAppliedColors.count(code) && mAppliedColors[code].hasPressed)
+            edje_color_class_del((code + PRESSED_SUFFIX).c_str());
+        mAppliedColors[code] = color;
+    }
+}
+
+void ThemeState::ApplyFonts(const _uxt_theme_font_table& table)
+{
+    for (const auto& [code, font] : table.fonts)
+    {
+        edje_text_class_set(code.c_str(), font.name.empty() ? nullptr : font.name.c_str(), font.size);
+        mAppliedFontCodes.insert(code);
+    }
+}
+
+void ThemeState::ClearAppliedColors()
+{
+    for (const auto& [code, color] : mAppliedColors)
+    {
+        edje_color_class_del(code.c_str());
+        if (color.hasPressed)
+            edje_color_class_del((code + PRESSED_SUFFIX).c_str());
+    }
+    mAppliedColors.clear();
+}
+
+void ThemeState::ClearAppliedFonts()
+{
+    for (const std::string& code : mAppliedFontCodes) edje_text_class_del(code.c_str());
+    mAppliedFontCodes.clear();
+}
+
+int ThemeState::ReplaceObjectColor(Evas_Object* obj, const char* code, const char* newCode)
+{
+    if (!obj || !code || !*code || !newCode || !*newCode)
+        return UXT_THEME_ERROR_INVALID_PARAMETER;
+    auto it = mAppliedColors.find(newCode);
+    if (it == mAppliedColors.end())
+        return UXT_THEME_ERROR_NO_DATA;
+    Evas_Object* edje = EdjeOf(obj);
+    if (!edje)
+        return UXT_THEME_ERROR_INVALID_PARAMETER;
+    const ThemeColor& c = it->second;
+    Eina_Bool ok = edje_object_color_class_set(edje, code, c.normal.r, c.normal.g, c.normal.b, c.normal.a,
+                                               c.outline.r, c.outline.g, c.outline.b, c.outline.a, c.shadow.r,
+                                               c.shadow.g, c.shadow.b, c.shadow.a);
+    return ok ? UXT_THEME_ERROR_NONE : UXT_THEME_ERROR_INVALID_OPERATION;
+}
+
+int ThemeState::AddChangedCallback(int type, uxt_theme_changed_cb cb, void* userData)
+{
+    if ((type != UXT_THEME_CHANGED_TYPE_COLOR && type != UXT_THEME_CHANGED_TYPE_FONT) || !cb)
+        return UXT_THEME_ERROR_INVALID_PARAMETER;
+    bool firstOfType = true;
+    for (const Listener& listener : mListeners)
+    {
+        if (listener.type == type && listener.cb == cb)
+            return UXT_THEME_ERROR_INVALID_PARAMETER;
+        firstOfType = firstOfType && listener.type != type;
+    }
+    if (firstOfType && !WatchKeys(type, true))
+        return UXT_THEME_ERROR_IO_ERROR;
+    mListeners.push_back({type, cb, userData});
+    return UXT_THEME_ERROR_NONE;
+}
+
+int ThemeState::RemoveChangedCallback(int type, uxt_theme_changed_cb cb)
+{
+    auto it = std::find_if(mListeners.begin(), mListeners.end(),
+                           [&](const Listener& l) { return l.type == type && l.cb == cb; });
+    if (it == mListeners.end())
+        return UXT_THEME_ERROR_INVALID_PARAMETER;
+    mListeners.erase(it);
+    bool lastOfType =
+        std::none_of(mListeners.begin(), mListeners.end(), [&](const Listener& l) { return l.type == type; });
+    if (lastOfType)
+        WatchKeys(type, false);
+    return UXT_THEME_ERROR_NONE;
+}
+
+bool ThemeState::WatchKeys(int type, bool watch)
+{
+    std::vector<const char*> keys;
+    vconf_callback_fn cb = nullptr;
+    if (type == UXT_THEME_CHANGED_TYPE_COLOR)
+    {
+        keys = {UXT_THEME_KEY_THEME};
+        cb = ColorKeyChangedCb;
+    }
+    else
+    {
+        keys = {UXT_THEME_KEY_FONT_NAME, UXT_THEME_KEY_FONT_SIZE};
+        cb = FontKeyChangedCb;
+    }
+    bool ok = true;
+    for (size_t i = 0; i < keys.size(); ++i)
+    {
+        if (!watch)
+        {
+            vconf_ignore_key_changed(keys[i], cb);
+            continue;
+        }
+        if (vconf_notify_key_changed(keys[i], cb, nullptr) != VCONF_OK)
+        {
+            dlog_print(DLOG_ERROR, LOG_TAG, "cannot watch %s", keys[i]);
+            for (size_t j = 0; j < i; ++j) vconf_ignore_key_changed(keys[j], cb);
+            ok = false;
+            break;
+        }
+    }
+    return ok;
+}
+
+void ThemeState::Notify(int type)
+{
+    // A callback may remove itself or others; call only those still there.
+    std::vector<Listener> listeners = mListeners;
+    for (const Listener& listener : listeners)
+    {
+        bool registered =
+            std::any_of(mListeners.begin(), mListeners.end(),
+                        [&](const Listener& l) { return l.type == listener.type && l.cb == listener.cb; });
+        if (listener.type == type && registered)
+            listener.cb(listener.userData);
+    }
+}
+
+void ThemeState::ColorKeyChangedCb(keynode_t* node, void* data)
+{
+    (void)node;
+    (void)data;
+    try
+    {
+        GetInstance().Notify(UXT_THEME_CHANGED_TYPE_COLOR);
+    }
+    catch (...)
+    {
+        dlog_print(DLOG_ERROR, LOG_TAG, "color change not delivered");
+    }
+}
+
+void ThemeState::FontKeyChangedCb(keynode_t* node, void* data)
+{
+    (void)node;
+    (void)data;
+    try
+    {
+        GetInstance().Notify(UXT_THEME_CHANGED_TYPE_FONT);
+    }
+    catch (...)
+    {
+        dlog_print(DLOG_ERROR, LOG_TAG, "font change not delivered");
+    }
+}
+
+}  // namespace theme
+}  // namespace platform
