@@ -1,0 +1,70 @@
+#ifndef PLATFORM_VCONF_VCONF_WATCH_H
+#define PLATFORM_VCONF_VCONF_WATCH_H
+
+#include <Ecore.h>
+
+#include <cstdint>
+#include <string>
+#include <vector>
+
+#include "vconf.h"
+#include "vconf/VconfStore.h"
+
+struct _keynode_t
+{
+    std::string name;
+    platform::vconf::Value value;
+};
+
+namespace platform
+{
+namespace vconf
+{
+
+// The key watches of this process: one inotify descriptor watching the
+// folders of the watched keys, read on the Ecore main loop. Main loop only.
+class WatchRegistry
+{
+public:
+    static WatchRegistry& GetInstance();
+
+    // VCONF_OK, or VCONF_ERROR (errno EALREADY for a (key, cb) pair that
+    // is already registered, EINVAL for a bad key).
+    int Add(const char* key, vconf_callback_fn cb, void* userData);
+    int Remove(const char* key, vconf_callback_fn cb);
+
+private:
+    struct Registration
+    {
+        uint64_t id;
+        std::string key;
+        std::string fileName;
+        int wd;
+        vconf_callback_fn cb;
+        void* userData;
+    };
+    struct Pending
+    {
+        uint64_t id;
+        std::string key;
+    };
+
+    WatchRegistry() = default;
+    bool EnsureDescriptor();
+    static Eina_Bool FdReadableCb(void* data, Ecore_Fd_Handler* handler);
+    void OnReadable();
+    void CollectEvents(std::vector<Pending>& pending);
+    void Dispatch(const Pending& pending);
+    const Registration* Find(uint64_t id) const;
+    bool IsWdInUse(int wd) const;
+
+    int mFd = -1;
+    Ecore_Fd_Handler* mHandler = nullptr;
+    std::vector<Registration> mRegistrations;
+    uint64_t mNextId = 1;
+};
+
+}  // namespace vconf
+}  // namespace platform
+
+#endif
