@@ -1,0 +1,133 @@
+// Usage-log client: records are appended to <root>/log/usage.log and their
+// completion is reported on the Ecore main loop.
+#include "quorvex_log_manager.h"
+
+#include <Ecore.h>
+#include <fcntl.h>
+#include <unistd.h>
+
+#include <atomic>
+#include <cerrno>
+#include <list>
+#include <new>
+#include <string>
+
+#include "bundle/BundleInternal.h"
+#include "core/PlatformRoot.h"
+#include "dlog.h"
+
+namespace
+{
+
+const char* const kLogTag = "USAGE_LOG";
+std::atomic<int> gNextRequestId{1};
+
+struct Completion
+{
+    quorvex_log_manager_h manager = nullptr;
+    Ecore_Job* job = nullptr;
+    int requestId = 0;
+    std::string uri;
+    quorvex_log_manager_insert_cb callback = nullptr;
+    void* userData = nullptr;
+};
+
+bool AppendRecord(const std::string& line)
+{
+    int fd = -1;
+    if (platform::MakeDirs(platform::RootPath("log")))
+        fd = open(platform::RootPath("log/usage.log").c_str(), O_WRONLY | O_CREAT | O_APPEND | O_CLOEXEC, 0644);
+    bool ok = fd >= 0 && write(fd, line.data(), line.size()) == static_cast<ssize_t>(line.size());
+    int error = errno;
+    if (fd >= 0)
+        close(fd);
+    if (!ok)
+        dlog_print(DLOG_ERROR, kLogTag, "cannot write the usage log (errno %d)", error);
+    return ok;
+}
+
+}  // namespace
+
+struct quorvex_log_manager_s
+{
+    std::list<Completion*> pending;
+};
+
+namespace
+{
+
+void CompletionCb(void* data)
+{
+    auto* completion = static_cast<Completion*>(data);
+    if (!completion)
+        return;
+    completion->manager->pending.remove(completion);
+    try
+    {
+        completion->callback(completion->requestId, completion->uri.c_str(), completion->userData);
+    }
+    catch (...)
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "exception in the completion of request %d", completion->requestId);
+    }
+    delete completion;
+}
+
+void ScheduleCompletion(quorvex_log_manager_h manager, int requestId, const char* uri,
+                        quorvex_log_manager_insert_cb callback, void* userData)
+{
+    auto* completion = new Completion{manager, nullptr, requestId, uri, callback, userData};
+    completion->job = ecore_job_add(CompletionCb, completion);
+    if (!completion->job)
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "cannot report the completion of request %d", requestId);
+        delete completion;
+        return;
+    }
+    manager->pending.push_back(completion);
+}
+
+}  // namespace
+
+extern "C" int quorvex_log_manager_create(quorvex_log_manager_h* manager)
+{
+    if (!manager)
+        return QUORVEX_LOG_MANAGER_ERROR_INVALID_PARAMETER;
+    *manager = new (std::nothrow) quorvex_log_manager_s();
+    if (!*manager)
+        return QUORVEX_LOG_MANAGER_ERROR_OUT_OF_MEMORY;
+    ecore_init();
+    return QUORVEX_LOG_MANAGER_ERROR_NONE;
+}
+
+extern "C" int quorvex_log_manager_destroy(quorvex_log_manager_h manager)
+{
+    if (!manager)
+        return QUORVEX_LOG_MANAGER_ERROR_INVALID_PARAMETER;
+    for (Completion* completion : manager->pending)
+    {
+        ecore_job_del(completion->job);
+        delete completion;
+    }
+    delete manager;
+    ecore_shutdown();
+    return QUORVEX_LOG_MANAGER_ERROR_NONE;
+}
+
+extern "C" int quorvex_log_manager_insert(quorvex_log_manager_h manager, const char* uri, bundle* data,
+                                          quorvex_log_manager_insert_cb callback, void* userData)
+{
+    if (!manager || !uri || !*uri || !data || data->items.empty())
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "rejected a record (uri \"%s\")", uri ? uri : "(null)");
+        return QUORVEX_LOG_MANAGER_ERROR_INVALID_PARAMETER;
+    }
+    int requestId = gNextRequestId++;
+    std::string line = "{\"request_id\":" + std::to_string(requestId) + ",\"uri\":" + platform::JsonQuote(uri) +
+                       ",\"data\":" + platform::BundleToJson(data) + "}\n";
+    if (!AppendRecord(line))
+        return QUORVEX_LOG_MANAGER_ERROR_IO_ERROR;
+    if (callback)
+        ScheduleCompletion(manager, requestId, uri, callback, userData);
+    return requestId;
+}
