@@ -1,0 +1,66 @@
+#ifndef WEATHER_TESTS_SETTINGS_TEST_SUPPORT_H
+#define WEATHER_TESTS_SETTINGS_TEST_SUPPORT_H
+
+#include <string>
+#include <vector>
+
+#include <sqlite3.h>
+
+#include "FileUtil.h"
+#include "TestPlatform.h"
+
+namespace SettingsTest
+{
+
+// Direct access to a database file, beside the code under test.
+class RawDB
+{
+public:
+    explicit RawDB(const std::string& path, bool isReadOnly = false);
+    ~RawDB();
+    RawDB(const RawDB&) = delete;
+    RawDB& operator=(const RawDB&) = delete;
+
+    bool GetIsOpen() const { return mHandle != nullptr; }
+    // Fails the running test when the statement fails.
+    void Exec(const std::string& sql);
+    bool TryExec(const std::string& sql);
+    // First column of the first row; empty text / 0 when there is none.
+    std::string QueryText(const std::string& sql);
+    double QueryDouble(const std::string& sql);
+    long long QueryInt(const std::string& sql);
+    std::vector<std::string> QueryTexts(const std::string& sql);
+    // The CREATE statement SQLite keeps for a table, empty when absent.
+    std::string TableSql(const std::string& table);
+    std::vector<std::string> ColumnNames(const std::string& table);
+
+private:
+    sqlite3* mHandle = nullptr;
+};
+
+bool FileExists(const std::string& path);
+std::string ReadFileBytes(const std::string& path);
+void WriteFileBytes(const std::string& path, const std::string& bytes);
+
+// A fresh platform root per test, with FileUtil asked again for it.
+class SettingsFixture : public WeatherTest::PlatformTest
+{
+protected:
+    SettingsFixture();
+    ~SettingsFixture() override;
+
+    std::string DBDir() const { return mRoot.SharedDataDir() + "db"; }
+    std::string SettingDBPath() const { return DBDir() + "/.setting.db"; }
+    std::string ShareTargetDBPath() const { return DBDir() + "/.share_target.db"; }
+    std::string VersionDBPath() const { return DBDir() + "/.version.db"; }
+    std::string WeatherDBPath() const { return DBDir() + "/.weather.db"; }
+    void MakeDBDir() const;
+    // Creates the settings row through the code under test.
+    void InitializeSettings() const;
+    // Sets one column of the settings row directly.
+    void SetSettingColumn(const std::string& column, const std::string& sqlValue) const;
+};
+
+}  // namespace SettingsTest
+
+#endif
