@@ -1,0 +1,203 @@
+// platform-setup: prepares a platform root with the system keys of a
+// fresh phone and registers the weather suite and its stand-ins.
+#include <getopt.h>
+#include <limits.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <fstream>
+#include <map>
+#include <string>
+
+#include "app_control.h"
+#include "app_control_launch.h"
+#include "core/PlatformRoot.h"
+#include "vconf.h"
+
+namespace
+{
+
+struct Options
+{
+    std::map<std::string, std::string> programs;  // app id -> program
+    std::string resDir;
+    std::string browser = "/bin/true";
+    bool reset = false;
+};
+
+void Usage()
+{
+    fprintf(stderr,
+            "usage: platform-setup [--root DIR] [--app PROGRAM] [--agent PROGRAM] [--widget PROGRAM]\n"
+            "                      [--res BUILD_RES_DIR] [--browser PROGRAM] [--reset]\n"
+            "Keys that exist are kept unless --reset is given.\n");
+}
+
+bool ParseOptions(int argc, char** argv, Options& options)
+{
+    static const option kOptions[] = {{"root", required_argument, nullptr, 'r'},
+                                      {"app", required_argument, nullptr, 'a'},
+                                      {"agent", required_argument, nullptr, 'g'},
+                                      {"widget", required_argument, nullptr, 'w'},
+                                      {"res", required_argument, nullptr, 's'},
+                                      {"browser", required_argument, nullptr, 'b'},
+                                      {"reset", no_argument, nullptr, 'x'},
+                                      {nullptr, 0, nullptr, 0}};
+    int c;
+    while ((c = getopt_long(argc, argv, "", kOptions, nullptr)) != -1)
+    {
+        switch (c)
+        {
+        case 'r': setenv("PLATFORM_ROOT", optarg, 1); break;
+        case 'a': options.programs["com.quorvex.weather-m"] = optarg; break;
+        case 'g': options.programs["com.quorvex.weather-m-agent"] = optarg; break;
+        case 'w': options.programs["com.quorvex.weather-m-widget"] = optarg; break;
+        case 's': options.resDir = optarg; break;
+        case 'b': options.browser = optarg; break;
+        case 'x': options.reset = true; break;
+        default: return false;
+        }
+    }
+    return optind == argc;
+}
+
+std::string Absolute(const std::string& path)
+{
+    char resolved[PATH_MAX];
+    return realpath(path.c_str(), resolved) ? std::string(resolved) : path;
+}
+
+// "Europe/Berlin" from TZ, /etc/localtime or /etc/timezone; "UTC" if none.
+std::string HostTimeZone()
+{
+    const char* tz = getenv("TZ");
+    if (tz && *tz && tz[0] != ':' && strchr(tz, '/'))
+        return tz;
+    char target[PATH_MAX];
+    ssize_t n = readlink("/etc/localtime", target, sizeof(target) - 1);
+    if (n > 0)
+    {
+        std::string link(target, static_cast<size_t>(n));
+        size_t at = link.find("zoneinfo/");
+        if (at != std::string::npos)
+            return link.substr(at + 9);
+    }
+    std::ifstream file("/etc/timezone");
+    std::string zone;
+    if (std::getline(file, zone) && !zone.empty())
+        return zone;
+    return "UTC";
+}
+
+bool SetInt(const char* key, int value, bool reset)
+{
+    int current = 0;
+    if (!reset && vconf_get_int(key, &current) == VCONF_OK)
+        return true;
+    return vconf_set_int(key, value) == VCONF_OK;
+}
+
+bool SetStr(const char* key, const std::string& value, bool reset)
+{
+    char* current = reset ? nullptr : vconf_get_str(key);
+    if (current)
+    {
+        free(current);
+        return true;
+    }
+    return vconf_set_str(key, value.c_str()) == VCONF_OK;
+}
+
+bool SetDefaultKeys(bool reset)
+{
+    bool ok = SetStr(VCONFKEY_LANGSET, "en_US.UTF-8", reset);
+    ok = SetStr(VCONFKEY_REGIONFORMAT, "en_US.UTF-8", reset) && ok;
+    ok = SetInt(VCONFKEY_REGIONFORMAT_TIME1224, 2, reset) && ok;
+    ok = SetInt(VCONFKEY_NETWORK_STATUS, 2, reset) && ok;
+    ok = SetInt(VCONFKEY_LOCATION_USE_MY_LOCATION, 1, reset) && ok;
+    ok = SetInt(VCONFKEY_LOCATION_ENABLED, 1, reset) && ok;
+    ok = SetInt(VCONFKEY_LOCATION_NETWORK_ENABLED, 1, reset) && ok;
+    ok = SetStr(VCONFKEY_SETAPPL_TIMEZONE_ID, HostTimeZone(), reset) && ok;
+    ok = SetInt(VCONFKEY_SETAPPL_DATE_FORMAT_INT, 0, reset) && ok;
+    ok = SetInt(VCONFKEY_SYSMAN_BATTERY_STATUS_LOW, 4, reset) && ok;
+    ok = SetInt(VCONFKEY_SYSMAN_LOW_MEMORY, 1, reset) && ok;
+    return ok;
+}
+
+// Points <app>/<sub> at <resDir>/<app id>/<sub> when the build has it;
+// otherwise makes sure the folder exists.
+bool LinkResources(const std::string& appId, const std::string& resDir, const char* sub)
+{
+    std::string installed = platform::AppDir(appId) + "/" + sub;
+    std::string built = resDir.empty() ? std::string() : Absolute(resDir) + "/" + appId + "/" + sub;
+    struct stat st;
+    if (built.empty() || stat(built.c_str(), &st) != 0 || !S_ISDIR(st.st_mode))
+        return platform::MakeDirs(installed);
+    if (lstat(installed.c_str(), &st) == 0)
+    {
+        if (S_ISLNK(st.st_mode))
+            unlink(installed.c_str());
+        else if (rmdir(installed.c_str()) != 0)
+        {
+            fprintf(stderr, "platform-setup: %s is not empty; left as it is\n", installed.c_str());
+            return false;
+        }
+    }
+    size_t slash = installed.rfind('/');
+    return platform::MakeDirs(installed.substr(0, slash)) && symlink(built.c_str(), installed.c_str()) == 0;
+}
+
+bool RegisterApp(const std::string& appId, const std::string& conf)
+{
+    std::string dir = platform::AppDir(appId);
+    return platform::MakeDirs(dir + "/shared/data") && (conf.empty() || platform::WriteFileAtomic(dir + "/app.conf", conf));
+}
+
+bool RegisterSuite(const Options& options)
+{
+    bool ok = true;
+    for (const char* appId : {"com.quorvex.weather-m", "com.quorvex.weather-m-agent", "com.quorvex.weather-m-widget"})
+    {
+        auto program = options.programs.find(appId);
+        std::string conf = program == options.programs.end() ? std::string() : "exec=" + Absolute(program->second) + "\n";
+        ok = RegisterApp(appId, conf) && ok;
+        ok = LinkResources(appId, options.resDir, "res") && ok;
+        ok = LinkResources(appId, options.resDir, "shared/res") && ok;
+    }
+    ok = RegisterApp(APP_CONTROL_BROWSER_APP_ID, "exec=" + Absolute(options.browser) + "\nview-uri=http,https\n") && ok;
+    ok = RegisterApp(APP_CONTROL_LOCATION_SETTING_APP_ID,
+                     std::string("exec=/bin/true\noperation=") + APP_CONTROL_OPERATION_SETTING_LOCATION + "\n") && ok;
+    return ok;
+}
+
+}  // namespace
+
+int main(int argc, char** argv)
+{
+    Options options;
+    if (!ParseOptions(argc, argv, options))
+    {
+        Usage();
+        return 2;
+    }
+    std::string root = platform::RootDir();
+    for (const char* sub : {"apps", "log", "run"})
+    {
+        if (!platform::MakeDirs(platform::RootPath(sub)))
+        {
+            fprintf(stderr, "platform-setup: cannot create %s\n", platform::RootPath(sub).c_str());
+            return 1;
+        }
+    }
+    bool keys = SetDefaultKeys(options.reset);
+    bool apps = RegisterSuite(options);
+    if (!keys)
+        fprintf(stderr, "platform-setup: some system keys could not be written\n");
+    if (!apps)
+        fprintf(stderr, "platform-setup: some applications could not be registered\n");
+    printf("%s\n", root.c_str());
+    return keys && apps ? 0 : 1;
+}
