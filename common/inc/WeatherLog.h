@@ -26,33 +26,35 @@ constexpr const char* LogFileName(const char* path)
     dlog_print(DLOG_ERROR, tag, "%s: %s(%d) > " WEATHER_LOG_COLOR_BEGIN fmt WEATHER_LOG_COLOR_END, \
                NSWeather::LogFileName(__FILE__), __func__, __LINE__, ##__VA_ARGS__)
 
-// Guards log the failed condition as source text and leave at once.
-#define WEATHER_RETV_IF(tag, cond, value)                                           \
-    do                                                                              \
-    {                                                                               \
-        if (cond)                                                                   \
-        {                                                                           \
-            WEATHER_LOG(tag, "[%s(): %d] (%s) [return]", __func__, __LINE__, #cond); \
-            return value;                                                           \
-        }                                                                           \
+// Guards log the failed condition as source text and leave at once. The
+// component macros stringify the condition themselves and pass the text
+// down: stringified here, NULL would already have been expanded.
+#define WEATHER_RETV_IF(tag, cond, condText, value)                                    \
+    do                                                                                 \
+    {                                                                                  \
+        if (cond)                                                                      \
+        {                                                                              \
+            WEATHER_LOG(tag, "[%s(): %d] (%s) [return]", __func__, __LINE__, condText); \
+            return value;                                                              \
+        }                                                                              \
     } while (0)
 
-#define WEATHER_RET_IF(tag, cond)                                                   \
-    do                                                                              \
-    {                                                                               \
-        if (cond)                                                                   \
-        {                                                                           \
-            WEATHER_LOG(tag, "[%s(): %d] (%s) [return]", __func__, __LINE__, #cond); \
-            return;                                                                 \
-        }                                                                           \
+#define WEATHER_RET_IF(tag, cond, condText)                                            \
+    do                                                                                 \
+    {                                                                                  \
+        if (cond)                                                                      \
+        {                                                                              \
+            WEATHER_LOG(tag, "[%s(): %d] (%s) [return]", __func__, __LINE__, condText); \
+            return;                                                                    \
+        }                                                                              \
     } while (0)
 
 // Leaves the enclosing loop or switch; no do/while wrapper on purpose.
-#define WEATHER_BREAK_IF(tag, cond)                                                \
-    if (cond)                                                                      \
-    {                                                                              \
-        WEATHER_LOG(tag, "[%s(): %d] (%s) [break]", __func__, __LINE__, #cond);    \
-        break;                                                                     \
+#define WEATHER_BREAK_IF(tag, cond, condText)                                         \
+    if (cond)                                                                         \
+    {                                                                                 \
+        WEATHER_LOG(tag, "[%s(): %d] (%s) [break]", __func__, __LINE__, condText);    \
+        break;                                                                        \
     }
 
 // Logs the [break] line for a condition without leaving anything; for

@@ -6,9 +6,9 @@
 #define UI_COMMON_LOG_TAG "weather-ui-common"
 
 #define UI_COMMON_LOG(fmt, ...) WEATHER_LOG(UI_COMMON_LOG_TAG, fmt, ##__VA_ARGS__)
-#define UI_COMMON_RETV_IF(cond, value) WEATHER_RETV_IF(UI_COMMON_LOG_TAG, cond, value)
-#define UI_COMMON_RET_IF(cond) WEATHER_RET_IF(UI_COMMON_LOG_TAG, cond)
-#define UI_COMMON_BREAK_IF(cond) WEATHER_BREAK_IF(UI_COMMON_LOG_TAG, cond)
+#define UI_COMMON_RETV_IF(cond, value) WEATHER_RETV_IF(UI_COMMON_LOG_TAG, cond, #cond, value)
+#define UI_COMMON_RET_IF(cond) WEATHER_RET_IF(UI_COMMON_LOG_TAG, cond, #cond)
+#define UI_COMMON_BREAK_IF(cond) WEATHER_BREAK_IF(UI_COMMON_LOG_TAG, cond, #cond)
 #define UI_COMMON_LOG_BREAK(condText) WEATHER_LOG_BREAK(UI_COMMON_LOG_TAG, condText)
 
 #endif
