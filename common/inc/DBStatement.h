@@ -6,6 +6,8 @@
 
 #include <sqlite3.h>
 
+#include "Temperature.h"
+
 namespace NSWeather
 {
 
@@ -27,13 +29,18 @@ public:
     bool BindDouble(int index, double value);
     // The text is copied, so a temporary string is safe to pass.
     bool BindText(int index, const std::string& value);
+    // Celsius rounded half up to one decimal; an absent value binds 999.
+    bool BindTemperature(int index, const TemperaturePtr& temperature);
     int Step();
+    // Makes the statement ready to run again with new values.
+    void Reset();
     // Columns start at 0.
     int ColumnInt(int column) const;
     int64_t ColumnInt64(int column) const;
     double ColumnDouble(int column) const;
     // SQL NULL reads as an empty string.
     std::string ColumnText(int column) const;
+    TemperaturePtr ColumnTemperature(int column) const;
 
 private:
     sqlite3_stmt* mStmt;

@@ -1,5 +1,7 @@
 #include "DBStatement.h"
 
+#include <cmath>
+
 #include "DBConnector.h"
 
 namespace NSWeather
@@ -38,11 +40,25 @@ bool DBStatement::BindText(int index, const std::string& value)
                SQLITE_OK;
 }
 
+bool DBStatement::BindTemperature(int index, const TemperaturePtr& temperature)
+{
+    double celsius = temperature ? temperature->GetCelsius() : 999.0;
+    return BindDouble(index, std::floor(0.5 + celsius * 10) / 10);
+}
+
 int DBStatement::Step()
 {
     if (!mStmt)
         return SQLITE_MISUSE;
     return sqlite3_step(mStmt);
+}
+
+void DBStatement::Reset()
+{
+    if (!mStmt)
+        return;
+    sqlite3_reset(mStmt);
+    sqlite3_clear_bindings(mStmt);
 }
 
 int DBStatement::ColumnInt(int column) const
@@ -69,6 +85,13 @@ std::string DBStatement::ColumnText(int column) const
         return std::string();
     int bytes = sqlite3_column_bytes(mStmt, column);
     return std::string(reinterpret_cast<const char*>(text), static_cast<size_t>(bytes));
+}
+
+TemperaturePtr DBStatement::ColumnTemperature(int column) const
+{
+    TemperaturePtr temperature = std::make_shared<Temperature>();
+    temperature->SetCelsiusValue(ColumnDouble(column));
+    return temperature;
 }
 
 }  // namespace NSWeather

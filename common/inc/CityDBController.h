@@ -1,0 +1,69 @@
+#ifndef NSWEATHER_CITY_DB_CONTROLLER_H
+#define NSWEATHER_CITY_DB_CONTROLLER_H
+
+#include <functional>
+#include <memory>
+#include <string>
+
+#include "City.h"
+#include "QueryGenernator.h"
+
+namespace NSWeather
+{
+
+class DBStatement;
+
+// Statements on CITY_TABLE. Runs on the cycle the caller has opened.
+class CityDBController
+{
+public:
+    static const char* const TABLE_NAME;
+    static const char* const CREATE_TABLE_FORMAT;
+
+    CityDBController();
+    virtual ~CityDBController();
+
+    void CreateTable();
+    // A current-location city gets ":C" appended to its id (record and row).
+    void Insert(CityPtr cityPtr);
+    // Leaves the widget reference count as stored.
+    void Update(CityPtr cityPtr, int primaryKey);
+    void UpdateOnlyWidgetReferenceCount(const std::string& locationId, int count);
+    void UpdateOnlyMobileLink(CityPtr cityPtr, int primaryKey);
+    int GetLastInsertedPrimaryKey();
+    // 0 when no row matches.
+    int GetPrimaryKey(int pageIndex);
+    int GetPrimaryKey(const std::string& locationId);
+    // -1 when no row comes back.
+    int GetNumberOfCities();
+    int GetPageIndexOfCurrentCity();
+    int GetPageIndexWithLocationID(const std::string& locationId);
+    std::string GetLocationIDWithPageIndex(int pageIndex);
+    std::string GetLocationIdOfCurrentCity();
+    bool IsCurrentLocationExist();
+    // Page indexes become 0, 1, ... in insertion (PK_ID) order.
+    void SetPageIndexAsAscending();
+    void Delete(int primaryKey);
+    void DeleteAll();
+    // Each city's stored page index names its row; its position in the
+    // vector becomes the new page index.
+    void Reorder(CityPtrVectorPtr reorderPtrVector);
+    CityPtr Select(int primaryKey);
+    CityPtr Select(const std::string& locationId);
+
+private:
+    using Binder = std::function<void(DBStatement&)>;
+
+    std::string ResolveLocationId(CityPtr cityPtr);
+    int SelectInt(const std::string& column, const std::string& condition, const Binder& binder, int defaultValue);
+    std::string SelectText(const std::string& column, const std::string& condition, const Binder& binder);
+    CityPtr SelectCity(const std::string& condition, const Binder& binder);
+
+    QueryGenernator mQueryGenernator;
+};
+
+using CityDBControllerPtr = std::shared_ptr<CityDBController>;
+
+}  // namespace NSWeather
+
+#endif

@@ -1,0 +1,38 @@
+#ifndef NSWEATHER_CURRENT_WEATHER_DB_CONTROLLER_H
+#define NSWEATHER_CURRENT_WEATHER_DB_CONTROLLER_H
+
+#include <memory>
+
+#include "Current.h"
+#include "QueryGenernator.h"
+
+namespace NSWeather
+{
+
+// Statements on CURRENT_WEATHER_TABLE (one row per city, keyed by FK_ID).
+class CurrentWeatherDBController
+{
+public:
+    static const char* const TABLE_NAME;
+    static const char* const CREATE_TABLE_FORMAT;
+
+    CurrentWeatherDBController();
+    virtual ~CurrentWeatherDBController();
+
+    void CreateTable();
+    void DeleteAll();
+    void Delete(int foreignKey);
+    void Insert(int foreignKey, CurrentPtr currentPtr);
+    void Update(int foreignKey, CurrentPtr currentPtr);
+    // Null when the city has no row.
+    CurrentPtr Select(int foreignKey);
+
+private:
+    QueryGenernator mQueryGenernator;
+};
+
+using CurrentWeatherDBControllerPtr = std::shared_ptr<CurrentWeatherDBController>;
+
+}  // namespace NSWeather
+
+#endif

@@ -1,0 +1,87 @@
+#ifndef NSWEATHER_DB_CONTROLLER_H
+#define NSWEATHER_DB_CONTROLLER_H
+
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "City.h"
+
+namespace NSWeather
+{
+
+class CityDBController;
+
+using StringVector = std::vector<std::string>;
+using StringVectorPtr = std::shared_ptr<StringVector>;
+
+// The weather database as the rest of the system sees it. Every operation
+// is one complete cycle on the DBConnector (open, one transaction, close);
+// a city is always read, written and deleted together with its forecast
+// rows. Failures give the empty value of the operation: null, -1, false,
+// an empty string or ERR_FAIL.
+class DBController
+{
+public:
+    DBController();
+    virtual ~DBController();
+
+    // Creates the missing tables; ERR_OK or ERR_FAIL.
+    int Initialize();
+
+    // Cities in page order with all their forecasts; empty, not null, when
+    // there are none.
+    CityPtrVectorPtr SelectAllCityData();
+    CityPtr SelectCityData(int pageIndex);
+    CityPtr SelectCityData(const std::string& locationID);
+    StringVectorPtr SelectAllLocationIDData();
+    StringVectorPtr SelectNeedToUpdateLocationIDData();
+    int GetNumberOfCities();
+    int GetPageIndexOfCurrentCity();
+    int GetPageIndexWithLocationID(const std::string& locationID);
+    std::string GetLocationIdOfCurrentCity();
+    bool IsCurrentLocationExist();
+
+    // Writers return ERR_OK or ERR_FAIL. A city with the location id and
+    // current-location flag of a stored one is not inserted (ERR_FAIL).
+    int InsertCityData(CityPtr cityPtr);
+    int UpdateCityData(CityPtr cityPtr);
+    // The count never drops below 0.
+    int UpdateOnlyWidgetReferenceCount(const std::string& locationID, bool isIncrease);
+    int UpdateOnlyMobileLink(CityPtr cityPtr);
+    int ReorderCityData(CityPtrVectorPtr reorderPtrVector);
+    int DeleteCityData(int pageIndex);
+    int DeleteCityData(const std::string& locationID);
+    int DeleteAllCityData();
+    // Replaces every city in a single transaction: another process sees the
+    // old list or the new one, never a half-written one.
+    int DeleteAllCityDataAndInsertCityPtrVector(CityPtrVectorPtr cityPtrVector);
+    int UpdateOnlyMoonPhaseData(CityPtr cityPtr);
+    // Removes moon rows whose location id belongs to no city.
+    int DeleteUselessMoonPhaseData();
+
+    // True when the oldest city refresh is older than the auto-refresh
+    // interval of the settings.
+    bool GetIsWeatherInfoExpired();
+
+    // Defined by another engineer in common/src/db/DBControllerUpgrade.cpp.
+    int UpgradeDB();
+    int UpgradeDB(double currentVersion);
+    int GetWeatherNewsIcon(int iconId, bool isDayTime);
+
+private:
+    CityPtr SelectDataWithPrimaryKey(CityDBController& cityDBController, int primaryKey);
+    CityPtrVectorPtr SelectAllCities(CityDBController& cityDBController);
+    bool InsertIfNew(CityDBController& cityDBController, CityPtr cityPtr);
+    void InsertDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr);
+    void UpdateDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr);
+    void DeleteDataWithPrimaryKey(CityDBController& cityDBController, int primaryKey);
+    void DeleteAll(CityDBController& cityDBController);
+    int ResolvePageIndex(CityDBController& cityDBController, const CityPtr& cityPtr);
+};
+
+using DBControllerPtr = std::shared_ptr<DBController>;
+
+}  // namespace NSWeather
+
+#endif

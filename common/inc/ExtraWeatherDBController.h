@@ -1,0 +1,38 @@
+#ifndef NSWEATHER_EXTRA_WEATHER_DB_CONTROLLER_H
+#define NSWEATHER_EXTRA_WEATHER_DB_CONTROLLER_H
+
+#include <memory>
+
+#include "Extra.h"
+#include "QueryGenernator.h"
+
+namespace NSWeather
+{
+
+// Statements on EXTRA_WEATHER_TABLE (one row per city, keyed by FK_ID).
+class ExtraWeatherDBController
+{
+public:
+    static const char* const TABLE_NAME;
+    static const char* const CREATE_TABLE_FORMAT;
+
+    ExtraWeatherDBController();
+    virtual ~ExtraWeatherDBController();
+
+    void CreateTable();
+    void DeleteAll();
+    void Delete(int foreignKey);
+    void Insert(int foreignKey, ExtraPtr extraPtr);
+    void Update(int foreignKey, ExtraPtr extraPtr);
+    // Null when the city has no row.
+    ExtraPtr Select(int foreignKey);
+
+private:
+    QueryGenernator mQueryGenernator;
+};
+
+using ExtraWeatherDBControllerPtr = std::shared_ptr<ExtraWeatherDBController>;
+
+}  // namespace NSWeather
+
+#endif

@@ -1,0 +1,44 @@
+#ifndef NSWEATHER_MOON_PHASE_DB_CONTROLLER_H
+#define NSWEATHER_MOON_PHASE_DB_CONTROLLER_H
+
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "MoonPhase.h"
+#include "QueryGenernator.h"
+
+namespace NSWeather
+{
+
+// Statements on MOON_PHASE_TABLE (rows keyed by FK_ID and moonPhaseIndex,
+// also found by their locationID).
+class MoonPhaseDBController
+{
+public:
+    static const char* const TABLE_NAME;
+    static const char* const CREATE_TABLE_FORMAT;
+
+    MoonPhaseDBController();
+    virtual ~MoonPhaseDBController();
+
+    void CreateTable();
+    void DeleteAll();
+    void Delete(int foreignKey);
+    void Delete(const std::string& locationId);
+    void Insert(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector);
+    void Update(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector);
+    // Never null; empty when the city has no rows.
+    MoonPhasePtrVectorPtr Select(int foreignKey);
+    // The location id of every stored series (its first row).
+    std::vector<std::string> SelectAllLocationId();
+
+private:
+    QueryGenernator mQueryGenernator;
+};
+
+using MoonPhaseDBControllerPtr = std::shared_ptr<MoonPhaseDBController>;
+
+}  // namespace NSWeather
+
+#endif

@@ -1,0 +1,40 @@
+#ifndef NSWEATHER_WEEKLY_WEATHER_DB_CONTROLLER_H
+#define NSWEATHER_WEEKLY_WEATHER_DB_CONTROLLER_H
+
+#include <memory>
+
+#include "Weekly.h"
+#include "QueryGenernator.h"
+
+namespace NSWeather
+{
+
+// Statements on WEEKLY_WEATHER_TABLE (rows keyed by FK_ID and weeklyIndex).
+class WeeklyWeatherDBController
+{
+public:
+    static const char* const TABLE_NAME;
+    static const char* const CREATE_TABLE_FORMAT;
+
+    WeeklyWeatherDBController();
+    virtual ~WeeklyWeatherDBController();
+
+    void CreateTable();
+    void DeleteAll();
+    void Delete(int foreignKey);
+    // Row i of the vector is stored with weeklyIndex i.
+    void Insert(int foreignKey, WeeklyPtrVectorPtr weeklyPtrVector);
+    // Changes only rows that exist; extra records are not written.
+    void Update(int foreignKey, WeeklyPtrVectorPtr weeklyPtrVector);
+    // Never null; empty when the city has no rows.
+    WeeklyPtrVectorPtr Select(int foreignKey);
+
+private:
+    QueryGenernator mQueryGenernator;
+};
+
+using WeeklyWeatherDBControllerPtr = std::shared_ptr<WeeklyWeatherDBController>;
+
+}  // namespace NSWeather
+
+#endif

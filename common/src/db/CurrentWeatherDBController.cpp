@@ -1,0 +1,112 @@
+#include "CurrentWeatherDBController.h"
+
+#include <cstdio>
+#include <string>
+
+#include "CommonLog.h"
+#include "DBConnector.h"
+#include "DBStatement.h"
+
+namespace NSWeather
+{
+
+const char* const CurrentWeatherDBController::TABLE_NAME = "CURRENT_WEATHER_TABLE";
+const char* const CurrentWeatherDBController::CREATE_TABLE_FORMAT =
+    "CREATE TABLE IF NOT EXISTS %s (FK_ID\t\t\t\tINTEGER,weatherIcon\t\tINTEGER,weatherStatus\t\tTEXT,"
+    "curTemperature\t\tDOUBLE,lowTemperature\t\tDOUBLE,highTemperature\tDOUBLE,date\t\t\t\tINT64,"
+    "websiteUrl \t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);";
+
+namespace
+{
+const char* const INSERT_COLUMNS =
+    "FK_ID,weatherIcon,weatherStatus,curTemperature,lowTemperature,highTemperature,date,websiteUrl";
+const char* const INSERT_PLACEHOLDERS = "?, ?, ?, ?, ?, ?, ?, ?";
+const char* const UPDATE_ASSIGNMENTS =
+    "weatherIcon = ?,weatherStatus = ?,curTemperature = ?,lowTemperature = ?,highTemperature = ?,date = ?,"
+    "websiteUrl = ?";
+const char* const SELECT_COLUMNS =
+    "weatherIcon,weatherStatus,curTemperature,lowTemperature,highTemperature,date,websiteUrl";
+
+int BindValues(DBStatement& stmt, int i, const CurrentPtr& currentPtr)
+{
+    stmt.BindInt(i++, currentPtr->GetWeatherIcon());
+    stmt.BindText(i++, currentPtr->GetWeatherStatus());
+    stmt.BindTemperature(i++, currentPtr->GetCurTemperature());
+    stmt.BindTemperature(i++, currentPtr->GetLowTemperature());
+    stmt.BindTemperature(i++, currentPtr->GetHighTemperature());
+    stmt.BindInt64(i++, static_cast<int64_t>(currentPtr->GetDate()));
+    stmt.BindText(i++, currentPtr->GetWebsiteUrl());
+    return i;
+}
+}  // namespace
+
+CurrentWeatherDBController::CurrentWeatherDBController()
+{
+}
+
+CurrentWeatherDBController::~CurrentWeatherDBController()
+{
+}
+
+void CurrentWeatherDBController::CreateTable()
+{
+    char query[1024] = {0};
+    snprintf(query, sizeof(query), CREATE_TABLE_FORMAT, TABLE_NAME);
+    DBConnector::GetInstance()->DBExecuteQuery(query);
+}
+
+void CurrentWeatherDBController::DeleteAll()
+{
+    DBConnector::GetInstance()->DBExecuteQuery((std::string("DELETE FROM ") + TABLE_NAME + ";").c_str());
+}
+
+void CurrentWeatherDBController::Delete(int foreignKey)
+{
+    DBStatement stmt(std::string("DELETE FROM ") + TABLE_NAME + " WHERE FK_ID=?;");
+    stmt.BindInt(1, foreignKey);
+    if (stmt.Step() != SQLITE_DONE)
+        COMMON_LOG("Fail to Delete");
+}
+
+void CurrentWeatherDBController::Insert(int foreignKey, CurrentPtr currentPtr)
+{
+    COMMON_RET_IF(!currentPtr);
+    DBStatement stmt(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS));
+    stmt.BindInt(1, foreignKey);
+    BindValues(stmt, 2, currentPtr);
+    stmt.Step();
+}
+
+void CurrentWeatherDBController::Update(int foreignKey, CurrentPtr currentPtr)
+{
+    COMMON_RET_IF(!currentPtr);
+    DBStatement stmt(mQueryGenernator.MakeUpdateQuery(TABLE_NAME, UPDATE_ASSIGNMENTS,
+                                                      mQueryGenernator.MakeWhereClause("FK_ID = ?;")));
+    int i = BindValues(stmt, 1, currentPtr);
+    stmt.BindInt(i, foreignKey);
+    stmt.Step();
+}
+
+CurrentPtr CurrentWeatherDBController::Select(int foreignKey)
+{
+    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS,
+                                                      mQueryGenernator.MakeWhereClause("FK_ID = ?")));
+    stmt.BindInt(1, foreignKey);
+    int rc = stmt.Step();
+    if (rc != SQLITE_ROW)
+    {
+        COMMON_LOG("No result : %d", rc);
+        return nullptr;
+    }
+    CurrentPtr currentPtr = std::make_shared<Current>();
+    currentPtr->SetWeatherIcon(stmt.ColumnInt(0));
+    currentPtr->SetWeatherStatus(stmt.ColumnText(1));
+    currentPtr->SetCurTemperature(stmt.ColumnTemperature(2));
+    currentPtr->SetLowTemperature(stmt.ColumnTemperature(3));
+    currentPtr->SetHighTemperature(stmt.ColumnTemperature(4));
+    currentPtr->SetDate(static_cast<time_t>(stmt.ColumnInt64(5)));
+    currentPtr->SetWebsiteUrl(stmt.ColumnText(6));
+    return currentPtr;
+}
+
+}  // namespace NSWeather

@@ -1,0 +1,429 @@
+#include "DBController.h"
+
+#include <algorithm>
+#include <ctime>
+
+#include "CityDBController.h"
+#include "CommonLog.h"
+#include "CurrentWeatherDBController.h"
+#include "DBConnector.h"
+#include "ExtraWeatherDBController.h"
+#include "FileUtil.h"
+#include "HourlyWeatherDBController.h"
+#include "MoonPhaseDBController.h"
+#include "SettingDBController.h"
+#include "WeatherDefine.h"
+#include "WeeklyWeatherDBController.h"
+
+namespace NSWeather
+{
+
+namespace
+{
+std::string GetWeatherDBFilePath()
+{
+    return FileUtil::GetWeatherDBFilePath();
+}
+
+// Commits and closes the cycle when the operation leaves, on every path.
+class CycleCloser
+{
+public:
+    explicit CycleCloser(DBConnector* dbConnector) : mDBConnector(dbConnector) {}
+    ~CycleCloser() { mDBConnector->DBFinalize(); }
+    CycleCloser(const CycleCloser&) = delete;
+    CycleCloser& operator=(const CycleCloser&) = delete;
+
+private:
+    DBConnector* mDBConnector;
+};
+}  // namespace
+
+DBController::DBController()
+{
+}
+
+DBController::~DBController()
+{
+}
+
+int DBController::Initialize()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
+    CycleCloser cycle(dbConnector);
+    CityDBController().CreateTable();
+    CurrentWeatherDBController().CreateTable();
+    WeeklyWeatherDBController().CreateTable();
+    HourlyWeatherDBController().CreateTable();
+    ExtraWeatherDBController().CreateTable();
+    MoonPhaseDBController().CreateTable();
+    return ERR_OK;
+}
+
+CityPtr DBController::SelectDataWithPrimaryKey(CityDBController& cityDBController, int primaryKey)
+{
+    CityPtr cityPtr = cityDBController.Select(primaryKey);
+    if (!cityPtr)
+    {
+        COMMON_LOG("!cityPtr");
+        return nullptr;
+    }
+    CurrentPtr currentPtr = CurrentWeatherDBController().Select(primaryKey);
+    WeeklyPtrVectorPtr weeklyPtrVector = WeeklyWeatherDBController().Select(primaryKey);
+    HourlyPtrVectorPtr hourlyPtrVector = HourlyWeatherDBController().Select(primaryKey);
+    ExtraPtr extraPtr = ExtraWeatherDBController().Select(primaryKey);
+    MoonPhasePtrVectorPtr moonPhasePtrVector = MoonPhaseDBController().Select(primaryKey);
+    cityPtr->SetCurrentPtr(currentPtr);
+    cityPtr->SetWeeklyPtrVector(weeklyPtrVector);
+    cityPtr->SetHourlyPtrVector(hourlyPtrVector);
+    cityPtr->SetExtraPtr(extraPtr);
+    cityPtr->SetMoonPhasePtrVector(moonPhasePtrVector);
+    return cityPtr;
+}
+
+CityPtrVectorPtr DBController::SelectAllCities(CityDBController& cityDBController)
+{
+    CityPtrVectorPtr cityPtrVector = std::make_shared<CityPtrVector>();
+    int count = cityDBController.GetNumberOfCities();
+    for (int pageIndex = 0; pageIndex < count; ++pageIndex)
+    {
+        int primaryKey = cityDBController.GetPrimaryKey(pageIndex);
+        CityPtr cityPtr = SelectDataWithPrimaryKey(cityDBController, primaryKey);
+        // A gap in the page indexes (another writer mid-change) is skipped.
+        if (cityPtr)
+            cityPtrVector->push_back(cityPtr);
+    }
+    return cityPtrVector;
+}
+
+CityPtrVectorPtr DBController::SelectAllCityData()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, nullptr);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    return SelectAllCities(cityDBController);
+}
+
+CityPtr DBController::SelectCityData(int pageIndex)
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, nullptr);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    return SelectDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(pageIndex));
+}
+
+CityPtr DBController::SelectCityData(const std::string& locationID)
+{
+    COMMON_RETV_IF(locationID.length() < 1, nullptr);
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, nullptr);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    return SelectDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(locationID));
+}
+
+StringVectorPtr DBController::SelectAllLocationIDData()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, nullptr);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    StringVectorPtr locationIdVector = std::make_shared<StringVector>();
+    int count = cityDBController.GetNumberOfCities();
+    for (int pageIndex = 0; pageIndex < count; ++pageIndex)
+        locationIdVector->push_back(cityDBController.GetLocationIDWithPageIndex(pageIndex));
+    return locationIdVector;
+}
+
+StringVectorPtr DBController::SelectNeedToUpdateLocationIDData()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, nullptr);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    StringVectorPtr locationIdVector = std::make_shared<StringVector>();
+    int count = cityDBController.GetNumberOfCities();
+    for (int pageIndex = 0; pageIndex < count; ++pageIndex)
+    {
+        // Only the city row is needed here, not its forecasts.
+        CityPtr cityPtr = cityDBController.Select(cityDBController.GetPrimaryKey(pageIndex));
+        if (cityPtr && cityPtr->GetNeedToUpdate())
+            locationIdVector->push_back(cityPtr->GetLocationId());
+    }
+    return locationIdVector;
+}
+
+int DBController::GetNumberOfCities()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, -1);
+    CycleCloser cycle(dbConnector);
+    return CityDBController().GetNumberOfCities();
+}
+
+int DBController::GetPageIndexOfCurrentCity()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, -1);
+    CycleCloser cycle(dbConnector);
+    return CityDBController().GetPageIndexOfCurrentCity();
+}
+
+int DBController::GetPageIndexWithLocationID(const std::string& locationID)
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, -1);
+    CycleCloser cycle(dbConnector);
+    return CityDBController().GetPageIndexWithLocationID(locationID);
+}
+
+std::string DBController::GetLocationIdOfCurrentCity()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, std::string());
+    CycleCloser cycle(dbConnector);
+    return CityDBController().GetLocationIdOfCurrentCity();
+}
+
+bool DBController::IsCurrentLocationExist()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, false);
+    CycleCloser cycle(dbConnector);
+    return CityDBController().IsCurrentLocationExist();
+}
+
+bool DBController::InsertIfNew(CityDBController& cityDBController, CityPtr cityPtr)
+{
+    CityPtrVectorPtr storedPtrVector = SelectAllCities(cityDBController);
+    for (const CityPtr& storedPtr : *storedPtrVector)
+    {
+        if (storedPtr->GetLocationId() == cityPtr->GetLocationId() &&
+            storedPtr->GetIsCurrentLocation() == cityPtr->GetIsCurrentLocation())
+        {
+            COMMON_LOG("There is a same city in DB");
+            return false;
+        }
+    }
+    InsertDataWithCityPtr(cityDBController, cityPtr);
+    return true;
+}
+
+void DBController::InsertDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr)
+{
+    COMMON_RET_IF(!cityPtr);
+    int count = cityDBController.GetNumberOfCities();
+    if (count > cityPtr->GetPageIndex())
+        cityPtr->SetPageIndex(count);
+    cityDBController.Insert(cityPtr);
+    int primaryKey = cityDBController.GetLastInsertedPrimaryKey();
+    CurrentWeatherDBController().Insert(primaryKey, cityPtr->GetCurrentPtr());
+    WeeklyWeatherDBController().Insert(primaryKey, cityPtr->GetWeeklyPtrVector());
+    HourlyWeatherDBController().Insert(primaryKey, cityPtr->GetHourlyPtrVector());
+    ExtraWeatherDBController().Insert(primaryKey, cityPtr->GetExtraPtr());
+}
+
+int DBController::InsertCityData(CityPtr cityPtr)
+{
+    COMMON_RETV_IF(!cityPtr, ERR_FAIL);
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    return InsertIfNew(cityDBController, cityPtr) ? ERR_OK : ERR_FAIL;
+}
+
+int DBController::ResolvePageIndex(CityDBController& cityDBController, const CityPtr& cityPtr)
+{
+    if (cityPtr->GetPageIndex() < 0)
+        cityPtr->SetPageIndex(cityDBController.GetPageIndexWithLocationID(cityPtr->GetLocationId()));
+    return cityPtr->GetPageIndex();
+}
+
+void DBController::UpdateDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr)
+{
+    COMMON_RET_IF(!cityPtr);
+    int primaryKey = cityDBController.GetPrimaryKey(ResolvePageIndex(cityDBController, cityPtr));
+    cityDBController.Update(cityPtr, primaryKey);
+    CurrentWeatherDBController().Update(primaryKey, cityPtr->GetCurrentPtr());
+    WeeklyWeatherDBController().Update(primaryKey, cityPtr->GetWeeklyPtrVector());
+    HourlyWeatherDBController hourlyDBController;
+    hourlyDBController.Delete(primaryKey);
+    hourlyDBController.Insert(primaryKey, cityPtr->GetHourlyPtrVector());
+    ExtraWeatherDBController().Update(primaryKey, cityPtr->GetExtraPtr());
+}
+
+int DBController::UpdateCityData(CityPtr cityPtr)
+{
+    COMMON_RETV_IF(!cityPtr, ERR_FAIL);
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    UpdateDataWithCityPtr(cityDBController, cityPtr);
+    return ERR_OK;
+}
+
+int DBController::UpdateOnlyWidgetReferenceCount(const std::string& locationID, bool isIncrease)
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    CityPtr cityPtr = cityDBController.Select(locationID);
+    COMMON_RETV_IF(!cityPtr, ERR_FAIL);
+    int count = cityPtr->GetWidgetReferenceCount();
+    count = isIncrease ? count + 1 : std::max(count - 1, 0);
+    cityDBController.UpdateOnlyWidgetReferenceCount(locationID, count);
+    return ERR_OK;
+}
+
+int DBController::UpdateOnlyMobileLink(CityPtr cityPtr)
+{
+    COMMON_RETV_IF(!cityPtr, ERR_FAIL);
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    int primaryKey = cityDBController.GetPrimaryKey(ResolvePageIndex(cityDBController, cityPtr));
+    cityDBController.UpdateOnlyMobileLink(cityPtr, primaryKey);
+    return ERR_OK;
+}
+
+int DBController::ReorderCityData(CityPtrVectorPtr reorderPtrVector)
+{
+    COMMON_RETV_IF(!reorderPtrVector, ERR_FAIL);
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
+    CycleCloser cycle(dbConnector);
+    CityDBController().Reorder(reorderPtrVector);
+    return ERR_OK;
+}
+
+void DBController::DeleteDataWithPrimaryKey(CityDBController& cityDBController, int primaryKey)
+{
+    cityDBController.Delete(primaryKey);
+    CurrentWeatherDBController().Delete(primaryKey);
+    WeeklyWeatherDBController().Delete(primaryKey);
+    HourlyWeatherDBController().Delete(primaryKey);
+    ExtraWeatherDBController().Delete(primaryKey);
+}
+
+int DBController::DeleteCityData(int pageIndex)
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    DeleteDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(pageIndex));
+    return ERR_OK;
+}
+
+int DBController::DeleteCityData(const std::string& locationID)
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    DeleteDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(locationID));
+    return ERR_OK;
+}
+
+void DBController::DeleteAll(CityDBController& cityDBController)
+{
+    COMMON_LOG("DeleteAllCityData");
+    cityDBController.DeleteAll();
+    CurrentWeatherDBController().DeleteAll();
+    WeeklyWeatherDBController().DeleteAll();
+    HourlyWeatherDBController().DeleteAll();
+    ExtraWeatherDBController().DeleteAll();
+}
+
+int DBController::DeleteAllCityData()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    DeleteAll(cityDBController);
+    return ERR_OK;
+}
+
+int DBController::DeleteAllCityDataAndInsertCityPtrVector(CityPtrVectorPtr cityPtrVector)
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    DeleteAll(cityDBController);
+    if (!cityPtrVector)
+        return ERR_OK;
+    for (const CityPtr& cityPtr : *cityPtrVector)
+    {
+        if (cityPtr)
+            InsertIfNew(cityDBController, cityPtr);
+    }
+    return ERR_OK;
+}
+
+int DBController::UpdateOnlyMoonPhaseData(CityPtr cityPtr)
+{
+    COMMON_RETV_IF(!cityPtr, ERR_FAIL);
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    int primaryKey = cityDBController.GetPrimaryKey(ResolvePageIndex(cityDBController, cityPtr));
+    MoonPhaseDBController moonPhaseDBController;
+    moonPhaseDBController.Delete(cityPtr->GetLocationId());
+    moonPhaseDBController.Insert(primaryKey, cityPtr->GetMoonPhasePtrVector());
+    return ERR_OK;
+}
+
+int DBController::DeleteUselessMoonPhaseData()
+{
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
+    CycleCloser cycle(dbConnector);
+    CityDBController cityDBController;
+    MoonPhaseDBController moonPhaseDBController;
+    StringVector moonPhaseLocIdVector = moonPhaseDBController.SelectAllLocationId();
+    COMMON_RETV_IF(moonPhaseLocIdVector.size() < 1, ERR_OK);
+    for (const std::string& locationId : moonPhaseLocIdVector)
+    {
+        if (cityDBController.GetPageIndexWithLocationID(locationId) < 0)
+            moonPhaseDBController.Delete(locationId);
+    }
+    return ERR_OK;
+}
+
+bool DBController::GetIsWeatherInfoExpired()
+{
+    SettingPtr settingPtr = SettingDBController().Select();
+    COMMON_RETV_IF(!settingPtr, false);
+    CityPtrVectorPtr cityPtrVector = SelectAllCityData();
+    COMMON_RETV_IF(cityPtrVector == NULL, false);
+    COMMON_RETV_IF(cityPtrVector->size() == 0, false);
+
+    int64_t lastRefreshedTime = 0;
+    for (const CityPtr& cityPtr : *cityPtrVector)
+    {
+        int64_t refreshedTime = static_cast<int64_t>(cityPtr->GetRefreshedTime());
+        if (lastRefreshedTime == 0 || refreshedTime < lastRefreshedTime)
+            lastRefreshedTime = refreshedTime;
+    }
+    int64_t timeInterval = static_cast<int64_t>(settingPtr->GetAutoRefreshInterval()) * 3600;
+    int64_t now = static_cast<int64_t>(time(nullptr));
+    COMMON_LOG("now [%lu], lastRefreshedTime [%lu], timeInterval [%lu]", static_cast<unsigned long>(now),
+               static_cast<unsigned long>(lastRefreshedTime), static_cast<unsigned long>(timeInterval));
+    // A refresh time ahead of the clock (the clock was set back) cannot be
+    // trusted and counts as expired.
+    if (lastRefreshedTime > now)
+        return true;
+    return now - lastRefreshedTime > timeInterval;
+}
+
+}  // namespace NSWeather

@@ -1,0 +1,167 @@
+#include "ExtraWeatherDBController.h"
+
+#include <cstdio>
+#include <string>
+
+#include "CommonLog.h"
+#include "DBConnector.h"
+#include "DBStatement.h"
+
+namespace NSWeather
+{
+
+const char* const ExtraWeatherDBController::TABLE_NAME = "EXTRA_WEATHER_TABLE";
+const char* const ExtraWeatherDBController::CREATE_TABLE_FORMAT =
+    "CREATE TABLE IF NOT EXISTS %s (FK_ID\t\t\t\tINTEGER,humidity\t\t\tINTEGER,sunsetTime\t\t\tINT64,"
+    "sunriseTime\t\tINT64,pm25\t\t\t\tINTEGER,pm10\t\t\t\tINTEGER,aqi\t\t\t\tINTEGER,uvIndex\t\t\tINTEGER,"
+    "outdoorExcercise\tINTEGER,comfort\t\t\tINTEGER,clothing\t\t\tINTEGER,skincare\t\t\tINTEGER,"
+    "carwash\t\t\tINTEGER,foodPoison\t\t\tINTEGER,heat\t\t\t\tINTEGER,spoiledFood\t\tINTEGER,"
+    "discomfort\t\t\tINTEGER,frozenPipes\t\tINTEGER,frostbite\t\t\tINTEGER,cold\t\t\t\tINTEGER,"
+    "pollen\t\t\t\tINTEGER,airDust\t\t\tINTEGER,drySkin\t\t\tINTEGER,realfeel\t\t\tDOUBLE,precType\t\t\tINTEGER,"
+    "precProbability\tDOUBLE,precAmount\t\t\tDOUBLE,precProbabilityNight\tDOUBLE,precAmountNight\t\t\tDOUBLE,"
+    "FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);";
+
+namespace
+{
+const char* const INSERT_COLUMNS =
+    "FK_ID,humidity,sunsetTime,sunriseTime,pm25,pm10,aqi,uvIndex,outdoorExcercise,comfort,clothing,skincare,"
+    "carwash,foodPoison,heat,spoiledFood,discomfort,frozenPipes,frostbite,cold,pollen,airDust,drySkin,realfeel,"
+    "precType,precProbability,precAmount,precProbabilityNight,precAmountNight";
+const char* const INSERT_PLACEHOLDERS =
+    "?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?";
+const char* const UPDATE_ASSIGNMENTS =
+    "humidity = ?,sunsetTime = ?,sunriseTime = ?,pm25 = ?,pm10 = ?,aqi = ?,uvIndex = ?,outdoorExcercise = ?,"
+    "comfort = ?,clothing = ?,skincare = ?,carwash = ?,foodPoison = ?,heat = ?,spoiledFood = ?,discomfort = ?,"
+    "frozenPipes = ?,frostbite = ?,cold = ?,pollen = ?,airDust = ?,drySkin = ?,realfeel = ?,precType = ?,"
+    "precProbability = ?,precAmount = ?,precProbabilityNight = ?,precAmountNight = ?";
+const char* const SELECT_COLUMNS =
+    "humidity,sunsetTime,sunriseTime,pm25,pm10,aqi,uvIndex,outdoorExcercise,comfort,clothing,skincare,carwash,"
+    "foodPoison,heat,spoiledFood,discomfort,frozenPipes,frostbite,cold,pollen,airDust,drySkin,realfeel,precType,"
+    "precProbability,precAmount,precProbabilityNight,precAmountNight";
+
+int BindValues(DBStatement& stmt, int i, const ExtraPtr& extraPtr)
+{
+    stmt.BindInt(i++, extraPtr->GetHumidity());
+    stmt.BindInt64(i++, static_cast<int64_t>(extraPtr->GetSunsetTime()));
+    stmt.BindInt64(i++, static_cast<int64_t>(extraPtr->GetSunriseTime()));
+    const int indexes[] = {extraPtr->GetPm25(),        extraPtr->GetPm10(),         extraPtr->GetAqi(),
+                           extraPtr->GetUvIndex(),     extraPtr->GetOutdoorExcercise(), extraPtr->GetComfort(),
+                           extraPtr->GetClothing(),    extraPtr->GetSkincare(),     extraPtr->GetCarwash(),
+                           extraPtr->GetFoodPoison(),  extraPtr->GetHeat(),         extraPtr->GetSpoiledFood(),
+                           extraPtr->GetDiscomfort(),  extraPtr->GetFrozenPipes(),  extraPtr->GetFrostbite(),
+                           extraPtr->GetCold(),        extraPtr->GetPollen(),       extraPtr->GetAirDust(),
+                           extraPtr->GetDrySkin()};
+    for (int value : indexes)
+        stmt.BindInt(i++, value);
+    stmt.BindTemperature(i++, extraPtr->GetRealfeel());
+    PrecipitationPtr precipitationPtr = extraPtr->GetPrecipitationPtr();
+    if (!precipitationPtr)
+        precipitationPtr = std::make_shared<Precipitation>();
+    stmt.BindInt(i++, precipitationPtr->GetPrecType());
+    stmt.BindDouble(i++, precipitationPtr->GetPrecProbability());
+    stmt.BindDouble(i++, precipitationPtr->GetPrecAmount());
+    stmt.BindDouble(i++, precipitationPtr->GetPrecProbabilityNight());
+    stmt.BindDouble(i++, precipitationPtr->GetPrecAmountNight());
+    return i;
+}
+
+ExtraPtr ReadExtra(const DBStatement& stmt)
+{
+    ExtraPtr extraPtr = std::make_shared<Extra>();
+    int c = 0;
+    extraPtr->SetHumidity(stmt.ColumnInt(c++));
+    extraPtr->SetSunsetTime(static_cast<time_t>(stmt.ColumnInt64(c++)));
+    extraPtr->SetSunriseTime(static_cast<time_t>(stmt.ColumnInt64(c++)));
+    extraPtr->SetPm25(stmt.ColumnInt(c++));
+    extraPtr->SetPm10(stmt.ColumnInt(c++));
+    extraPtr->SetAqi(stmt.ColumnInt(c++));
+    extraPtr->SetUvIndex(stmt.ColumnInt(c++));
+    extraPtr->SetOutdoorExcercise(stmt.ColumnInt(c++));
+    extraPtr->SetComfort(stmt.ColumnInt(c++));
+    extraPtr->SetClothing(stmt.ColumnInt(c++));
+    extraPtr->SetSkincare(stmt.ColumnInt(c++));
+    extraPtr->SetCarwash(stmt.ColumnInt(c++));
+    extraPtr->SetFoodPoison(stmt.ColumnInt(c++));
+    extraPtr->SetHeat(stmt.ColumnInt(c++));
+    extraPtr->SetSpoiledFood(stmt.ColumnInt(c++));
+    extraPtr->SetDiscomfort(stmt.ColumnInt(c++));
+    extraPtr->SetFrozenPipes(stmt.ColumnInt(c++));
+    extraPtr->SetFrostbite(stmt.ColumnInt(c++));
+    extraPtr->SetCold(stmt.ColumnInt(c++));
+    extraPtr->SetPollen(stmt.ColumnInt(c++));
+    extraPtr->SetAirDust(stmt.ColumnInt(c++));
+    extraPtr->SetDrySkin(stmt.ColumnInt(c++));
+    extraPtr->SetRealfeel(stmt.ColumnTemperature(c++));
+    PrecipitationPtr precipitationPtr = std::make_shared<Precipitation>();
+    precipitationPtr->SetPrecType(stmt.ColumnInt(c++));
+    precipitationPtr->SetPrecProbability(stmt.ColumnDouble(c++));
+    precipitationPtr->SetPrecAmount(stmt.ColumnDouble(c++));
+    precipitationPtr->SetPrecProbabilityNight(stmt.ColumnDouble(c++));
+    precipitationPtr->SetPrecAmountNight(stmt.ColumnDouble(c++));
+    extraPtr->SetPrecipitationPtr(precipitationPtr);
+    return extraPtr;
+}
+}  // namespace
+
+ExtraWeatherDBController::ExtraWeatherDBController()
+{
+}
+
+ExtraWeatherDBController::~ExtraWeatherDBController()
+{
+}
+
+void ExtraWeatherDBController::CreateTable()
+{
+    char query[1024] = {0};
+    snprintf(query, sizeof(query), CREATE_TABLE_FORMAT, TABLE_NAME);
+    DBConnector::GetInstance()->DBExecuteQuery(query);
+}
+
+void ExtraWeatherDBController::DeleteAll()
+{
+    DBConnector::GetInstance()->DBExecuteQuery((std::string("DELETE FROM ") + TABLE_NAME + ";").c_str());
+}
+
+void ExtraWeatherDBController::Delete(int foreignKey)
+{
+    DBStatement stmt(std::string("DELETE FROM ") + TABLE_NAME + " WHERE FK_ID=?;");
+    stmt.BindInt(1, foreignKey);
+    if (stmt.Step() != SQLITE_DONE)
+        COMMON_LOG("Fail to Delete");
+}
+
+void ExtraWeatherDBController::Insert(int foreignKey, ExtraPtr extraPtr)
+{
+    COMMON_RET_IF(!extraPtr);
+    DBStatement stmt(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS));
+    stmt.BindInt(1, foreignKey);
+    BindValues(stmt, 2, extraPtr);
+    stmt.Step();
+}
+
+void ExtraWeatherDBController::Update(int foreignKey, ExtraPtr extraPtr)
+{
+    COMMON_RET_IF(!extraPtr);
+    DBStatement stmt(mQueryGenernator.MakeUpdateQuery(TABLE_NAME, UPDATE_ASSIGNMENTS,
+                                                      mQueryGenernator.MakeWhereClause("FK_ID = ?")));
+    int i = BindValues(stmt, 1, extraPtr);
+    stmt.BindInt(i, foreignKey);
+    stmt.Step();
+}
+
+ExtraPtr ExtraWeatherDBController::Select(int foreignKey)
+{
+    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS,
+                                                      mQueryGenernator.MakeWhereClause("FK_ID = ?")));
+    stmt.BindInt(1, foreignKey);
+    int rc = stmt.Step();
+    if (rc != SQLITE_ROW)
+    {
+        COMMON_LOG("No result : %d", rc);
+        return nullptr;
+    }
+    return ReadExtra(stmt);
+}
+
+}  // namespace NSWeather

@@ -1,0 +1,141 @@
+#include "MoonPhaseDBController.h"
+
+#include <cstdio>
+
+#include "CommonLog.h"
+#include "DBConnector.h"
+#include "DBStatement.h"
+
+namespace NSWeather
+{
+
+const char* const MoonPhaseDBController::TABLE_NAME = "MOON_PHASE_TABLE";
+const char* const MoonPhaseDBController::CREATE_TABLE_FORMAT =
+    "CREATE TABLE IF NOT EXISTS %s (FK_ID\t\t\t\tINTEGER,moonPhaseIndex\t\tINTEGER,locationID\t\t\tTEXT,"
+    "date\t\t\t\tINT64,moonRiseTime\t\tINT64,moonSetTime\t\tINT64,phaseText\t\t\tTEXT,age\t\t\t\tINTEGER,"
+    "FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);";
+
+namespace
+{
+const char* const INSERT_COLUMNS = "FK_ID,moonPhaseIndex,locationID,date,moonRiseTime,moonSetTime,phaseText,age";
+const char* const INSERT_PLACEHOLDERS = "?, ?, ?, ?, ?, ?, ?, ?";
+const char* const UPDATE_ASSIGNMENTS =
+    "locationID = ?,date = ?,moonRiseTime = ?,moonSetTime = ?,phaseText = ?,age = ?";
+const char* const SELECT_COLUMNS = "locationID,date,moonRiseTime,moonSetTime,phaseText,age";
+
+int BindValues(DBStatement& stmt, int i, const MoonPhasePtr& moonPhasePtr)
+{
+    stmt.BindText(i++, moonPhasePtr->GetLocationID());
+    stmt.BindInt64(i++, static_cast<int64_t>(moonPhasePtr->GetDate()));
+    stmt.BindInt64(i++, static_cast<int64_t>(moonPhasePtr->GetMoonRiseTime()));
+    stmt.BindInt64(i++, static_cast<int64_t>(moonPhasePtr->GetMoonSetTime()));
+    stmt.BindText(i++, moonPhasePtr->GetPhaseText());
+    stmt.BindInt(i++, moonPhasePtr->GetAge());
+    return i;
+}
+}  // namespace
+
+MoonPhaseDBController::MoonPhaseDBController()
+{
+}
+
+MoonPhaseDBController::~MoonPhaseDBController()
+{
+}
+
+void MoonPhaseDBController::CreateTable()
+{
+    char query[1024] = {0};
+    snprintf(query, sizeof(query), CREATE_TABLE_FORMAT, TABLE_NAME);
+    DBConnector::GetInstance()->DBExecuteQuery(query);
+}
+
+void MoonPhaseDBController::DeleteAll()
+{
+    DBConnector::GetInstance()->DBExecuteQuery((std::string("DELETE FROM ") + TABLE_NAME + ";").c_str());
+}
+
+void MoonPhaseDBController::Delete(int foreignKey)
+{
+    DBStatement stmt(std::string("DELETE FROM ") + TABLE_NAME + " WHERE FK_ID=?;");
+    stmt.BindInt(1, foreignKey);
+    if (stmt.Step() != SQLITE_DONE)
+        COMMON_LOG("Fail to Delete");
+}
+
+void MoonPhaseDBController::Delete(const std::string& locationId)
+{
+    DBStatement stmt(std::string("DELETE FROM ") + TABLE_NAME + " WHERE locationID = ?;");
+    stmt.BindText(1, locationId);
+    if (stmt.Step() != SQLITE_DONE)
+        COMMON_LOG("Fail to Delete");
+}
+
+void MoonPhaseDBController::Insert(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector)
+{
+    COMMON_RET_IF(!moonPhasePtrVector);
+    DBStatement stmt(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS));
+    for (size_t i = 0; i < moonPhasePtrVector->size(); ++i)
+    {
+        const MoonPhasePtr& moonPhasePtr = moonPhasePtrVector->at(i);
+        if (!moonPhasePtr)
+            continue;
+        stmt.Reset();
+        stmt.BindInt(1, foreignKey);
+        stmt.BindInt(2, static_cast<int>(i));
+        BindValues(stmt, 3, moonPhasePtr);
+        stmt.Step();
+    }
+}
+
+void MoonPhaseDBController::Update(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector)
+{
+    COMMON_RET_IF(!moonPhasePtrVector);
+    DBStatement stmt(mQueryGenernator.MakeUpdateQuery(
+        TABLE_NAME, UPDATE_ASSIGNMENTS, mQueryGenernator.MakeWhereClause("FK_ID = ? AND moonPhaseIndex = ?;")));
+    for (size_t i = 0; i < moonPhasePtrVector->size(); ++i)
+    {
+        const MoonPhasePtr& moonPhasePtr = moonPhasePtrVector->at(i);
+        if (!moonPhasePtr)
+            continue;
+        stmt.Reset();
+        int next = BindValues(stmt, 1, moonPhasePtr);
+        stmt.BindInt(next, foreignKey);
+        stmt.BindInt(next + 1, static_cast<int>(i));
+        stmt.Step();
+    }
+}
+
+MoonPhasePtrVectorPtr MoonPhaseDBController::Select(int foreignKey)
+{
+    MoonPhasePtrVectorPtr moonPhasePtrVector = std::make_shared<MoonPhasePtrVector>();
+    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS,
+                                                      mQueryGenernator.MakeWhereClause("FK_ID = ?")));
+    stmt.BindInt(1, foreignKey);
+    while (stmt.Step() == SQLITE_ROW)
+    {
+        MoonPhasePtr moonPhasePtr = std::make_shared<MoonPhase>();
+        moonPhasePtr->SetLocationID(stmt.ColumnText(0));
+        moonPhasePtr->SetDate(static_cast<time_t>(stmt.ColumnInt64(1)));
+        moonPhasePtr->SetMoonRiseTime(static_cast<time_t>(stmt.ColumnInt64(2)));
+        moonPhasePtr->SetMoonSetTime(static_cast<time_t>(stmt.ColumnInt64(3)));
+        moonPhasePtr->SetPhaseText(stmt.ColumnText(4));
+        moonPhasePtr->SetAge(stmt.ColumnInt(5));
+        moonPhasePtrVector->push_back(moonPhasePtr);
+    }
+    return moonPhasePtrVector;
+}
+
+std::vector<std::string> MoonPhaseDBController::SelectAllLocationId()
+{
+    std::vector<std::string> retStringVector;
+    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, "locationID",
+                                                      mQueryGenernator.MakeWhereClause("moonPhaseIndex = 0")));
+    while (stmt.Step() == SQLITE_ROW)
+        retStringVector.push_back(stmt.ColumnText(0));
+    if (retStringVector.size() < 1)
+        COMMON_LOG("retStringVector.size() < 1");
+    return retStringVector;
+}
+
+}  // namespace NSWeather
