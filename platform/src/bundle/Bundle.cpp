@@ -6,6 +6,7 @@
 #include <new>
 
 #include "bundle/BundleInternal.h"
+#include "dlog.h"
 
 namespace
 {
@@ -131,14 +132,16 @@ extern "C" int bundle_encode(bundle* b, bundle_raw** raw, int* len)
 extern "C" bundle* bundle_decode(const bundle_raw* raw, const int len)
 {
     std::string binary;
-    if (!raw || len <= 0 ||
-        !platform::Base64Decode(reinterpret_cast<const char*>(raw), static_cast<size_t>(len), binary))
+    bundle* b = nullptr;
+    if (raw && len > 0 && platform::Base64Decode(reinterpret_cast<const char*>(raw), static_cast<size_t>(len), binary))
+        b = platform::BundleFromBinary(binary);
+    if (!b)
     {
+        dlog_print(DLOG_ERROR, "BUNDLE", "rejected a malformed encoding of %d bytes", len);
         Fail(BUNDLE_ERROR_INVALID_PARAMETER);
         return nullptr;
     }
-    bundle* b = platform::BundleFromBinary(binary);
-    Fail(b ? BUNDLE_ERROR_NONE : BUNDLE_ERROR_INVALID_PARAMETER);
+    Fail(BUNDLE_ERROR_NONE);
     return b;
 }
 
