@@ -1,0 +1,129 @@
+#include <net_connection.h>
+#include <vconf.h>
+
+#include <Ecore.h>
+#include <gtest/gtest.h>
+
+#include <vector>
+
+#include "MainLoop.h"
+#include "TestPlatform.h"
+
+namespace
+{
+using WeatherTest::PlatformTest;
+using WeatherTest::RunLoopFor;
+using WeatherTest::RunLoopUntil;
+
+class ConnectionTest : public PlatformTest
+{
+protected:
+    void SetUp() override
+    {
+        ecore_init();
+        ASSERT_EQ(connection_create(&mConnection), CONNECTION_ERROR_NONE);
+    }
+    void TearDown() override
+    {
+        if (mConnection)
+            connection_destroy(mConnection);
+        ecore_shutdown();
+    }
+    static void TypeChangedCb(connection_type_e type, void* data)
+    {
+        static_cast<std::vector<int>*>(data)->push_back(type);
+    }
+    connection_h mConnection = nullptr;
+};
+
+TEST_F(ConnectionTest, StatusKeyNumberingMapsOntoConnectionTypes)
+{
+    const struct
+    {
+        int status;
+        connection_type_e type;
+    } kCases[] = {{VCONFKEY_NETWORK_OFF, CONNECTION_TYPE_DISCONNECTED},
+                  {VCONFKEY_NETWORK_CELLULAR, CONNECTION_TYPE_CELLULAR},
+                  {VCONFKEY_NETWORK_WIFI, CONNECTION_TYPE_WIFI},
+                  {VCONFKEY_NETWORK_ETHERNET, CONNECTION_TYPE_ETHERNET},
+                  {VCONFKEY_NETWORK_BLUETOOTH, CONNECTION_TYPE_BT},
+                  {17, CONNECTION_TYPE_DISCONNECTED},
+                  {-1, CONNECTION_TYPE_DISCONNECTED}};
+    for (const auto& item : kCases)
+    {
+        SCOPED_TRACE(item.status);
+        ASSERT_EQ(vconf_set_int(VCONFKEY_NETWORK_STATUS, item.status), VCONF_OK);
+        connection_type_e type = CONNECTION_TYPE_BT;
+        EXPECT_EQ(connection_get_type(mConnection, &type), CONNECTION_ERROR_NONE);
+        EXPECT_EQ(type, item.type);
+    }
+}
+
+TEST_F(ConnectionTest, UnreadableStatusFails)
+{
+    connection_type_e type = CONNECTION_TYPE_WIFI;
+    EXPECT_EQ(connection_get_type(mConnection, &type), CONNECTION_ERROR_OPERATION_FAILED);
+    ASSERT_EQ(vconf_set_str(VCONFKEY_NETWORK_STATUS, "wifi"), VCONF_OK);
+    EXPECT_EQ(connection_get_type(mConnection, &type), CONNECTION_ERROR_OPERATION_FAILED);
+    EXPECT_EQ(type, CONNECTION_TYPE_WIFI);
+}
+
+TEST_F(ConnectionTest, ChangeOfStatusReachesCallbackWithNewType)
+{
+    std::vector<int> seen;
+    ASSERT_EQ(connection_set_type_changed_cb(mConnection, TypeChangedCb, &seen), CONNECTION_ERROR_NONE);
+    vconf_set_int(VCONFKEY_NETWORK_STATUS, VCONFKEY_NETWORK_CELLULAR);
+    ASSERT_TRUE(RunLoopUntil([&] { return seen.size() == 1; }, 5.0));
+    vconf_set_int(VCONFKEY_NETWORK_STATUS, VCONFKEY_NETWORK_OFF);
+    ASSERT_TRUE(RunLoopUntil([&] { return seen.size() == 2; }, 5.0));
+    EXPECT_EQ(seen, (std::vector<int>{CONNECTION_TYPE_CELLULAR, CONNECTION_TYPE_DISCONNECTED}));
+}
+
+TEST_F(ConnectionTest, SeveralHandlesEachHearChangesUntilUnset)
+{
+    connection_h second = nullptr;
+    ASSERT_EQ(connection_create(&second), CONNECTION_ERROR_NONE);
+    std::vector<int> first;
+    std::vector<int> other;
+    ASSERT_EQ(connection_set_type_changed_cb(mConnection, TypeChangedCb, &first), CONNECTION_ERROR_NONE);
+    ASSERT_EQ(connection_set_type_changed_cb(second, TypeChangedCb, &other), CONNECTION_ERROR_NONE);
+    vconf_set_int(VCONFKEY_NETWORK_STATUS, VCONFKEY_NETWORK_WIFI);
+    ASSERT_TRUE(RunLoopUntil([&] { return first.size() == 1 && other.size() == 1; }, 5.0));
+
+    EXPECT_EQ(connection_unset_type_changed_cb(mConnection), CONNECTION_ERROR_NONE);
+    vconf_set_int(VCONFKEY_NETWORK_STATUS, VCONFKEY_NETWORK_ETHERNET);
+    ASSERT_TRUE(RunLoopUntil([&] { return other.size() == 2; }, 5.0));
+    EXPECT_EQ(other.back(), CONNECTION_TYPE_ETHERNET);
+
+    EXPECT_EQ(connection_destroy(second), CONNECTION_ERROR_NONE);
+    vconf_set_int(VCONFKEY_NETWORK_STATUS, VCONFKEY_NETWORK_WIFI);
+    RunLoopFor(0.2);
+    EXPECT_EQ(first.size(), 1u);
+    EXPECT_EQ(other.size(), 2u);
+}
+
+TEST_F(ConnectionTest, BadHandlesAndArgumentsAreRejected)
+{
+    connection_type_e type;
+    int notAHandle = 0;
+    EXPECT_EQ(connection_create(nullptr), CONNECTION_ERROR_INVALID_PARAMETER);
+    EXPECT_EQ(connection_get_type(nullptr, &type), CONNECTION_ERROR_INVALID_PARAMETER);
+    EXPECT_EQ(connection_get_type(&notAHandle, &type), CONNECTION_ERROR_INVALID_PARAMETER);
+    EXPECT_EQ(connection_get_type(mConnection, nullptr), CONNECTION_ERROR_INVALID_PARAMETER);
+    EXPECT_EQ(connection_set_type_changed_cb(mConnection, nullptr, nullptr), CONNECTION_ERROR_INVALID_PARAMETER);
+    EXPECT_EQ(connection_unset_type_changed_cb(&notAHandle), CONNECTION_ERROR_INVALID_PARAMETER);
+    EXPECT_EQ(connection_destroy(mConnection), CONNECTION_ERROR_NONE);
+    // A second destroy of the same handle is refused, not a double free.
+    EXPECT_EQ(connection_destroy(mConnection), CONNECTION_ERROR_INVALID_PARAMETER);
+    mConnection = nullptr;
+}
+
+TEST(ConnectionErrorTest, CodesMatchThePlatform)
+{
+    EXPECT_EQ(static_cast<unsigned>(CONNECTION_ERROR_OPERATION_FAILED), 0xFE3F0401u);
+    EXPECT_EQ(static_cast<unsigned>(CONNECTION_ERROR_NO_REPLY), 0xFE3F0408u);
+    EXPECT_EQ(static_cast<unsigned>(CONNECTION_ERROR_NOT_SUPPORTED), 0xC0000002u);
+    EXPECT_EQ(CONNECTION_ERROR_NOW_IN_PROGRESS, -115);
+}
+
+}  // namespace
