@@ -1,0 +1,179 @@
+#include "DBTestSupport.h"
+
+#include "DBController.h"
+#include "FileUtil.h"
+#include "WeatherDefine.h"
+
+using namespace NSWeather;
+
+namespace WeatherTest
+{
+
+void DBTest::SetUp()
+{
+    FileUtil::ClearCache();
+    FileUtil::MakeDirectory(DBDir());
+    ASSERT_EQ(DBController().Initialize(), ERR_OK) << mLog.Dump();
+}
+
+std::string DBTest::DBDir() const
+{
+    return mRoot.SharedDataDir() + "db";
+}
+
+std::string DBTest::WeatherDBPath() const
+{
+    return mRoot.SharedDataDir() + "db/.weather.db";
+}
+
+CityPtr MakeCity(const std::string& locationId, int seed, bool isCurrentLocation)
+{
+    CityPtr city = std::make_shared<City>();
+    std::string tag = locationId + "-" + std::to_string(seed);
+    city->SetPageIndex(0);
+    city->SetLocationId(locationId);
+    city->SetIsCurrentLocation(isCurrentLocation);
+    city->SetIsSummerTime(seed % 2 == 1);
+    city->SetIsDayTime(seed % 2 == 0);
+    city->SetWidgetReferenceCount(seed);
+    city->SetCityName("city " + tag);
+    city->SetCityNameEng("City " + tag);
+    city->SetCountryName("country " + tag);
+    city->SetCountryNameEng("Country " + tag);
+    city->SetWebsiteUrl("http://example.com/" + tag);
+    city->SetGmtOffset(5.5 + seed);
+    city->SetRefreshedTime(1700000000 + seed);
+    city->SetLocalTime(1700003600 + seed);
+    city->SetNeedToUpdate(seed % 3 == 0);
+
+    CurrentPtr current = std::make_shared<Current>();
+    current->SetWeatherIcon(7 + seed);
+    current->SetWeatherStatus("Cloudy " + tag);
+    current->GetCurTemperature()->SetCelsiusValue(21.46);
+    current->GetLowTemperature()->SetCelsiusValue(-0.04);
+    current->GetHighTemperature()->SetCelsiusValue(999.0);
+    current->SetDate(1700000100 + seed);
+    current->SetWebsiteUrl("http://example.com/current/" + tag);
+    city->SetCurrentPtr(current);
+
+    WeeklyPtrVectorPtr weekly = std::make_shared<WeeklyPtrVector>();
+    for (int i = 0; i < 10; ++i)
+    {
+        WeeklyPtr day = std::make_shared<Weekly>();
+        day->SetWeatherIcon(i + seed);
+        day->SetWeatherStatus("day " + std::to_string(i));
+        day->GetCurTemperature()->SetCelsiusValue(10.0 + i);
+        day->GetLowTemperature()->SetCelsiusValue(-5.25 + i);
+        day->GetHighTemperature()->SetCelsiusValue(20.5 + i);
+        day->SetDate(1700000000 + i * 86400);
+        day->SetWebsiteUrl("http://example.com/day/" + std::to_string(i));
+        weekly->push_back(day);
+    }
+    city->SetWeeklyPtrVector(weekly);
+
+    HourlyPtrVectorPtr hourly = std::make_shared<HourlyPtrVector>();
+    for (int i = 0; i < 24; ++i)
+    {
+        HourlyPtr hour = std::make_shared<Hourly>();
+        hour->SetHour(1700000000 + i * 3600);
+        hour->SetWeatherIcon(30 + i);
+        hour->SetWeatherStatus("hour " + std::to_string(i));
+        hour->GetCurTemperature()->SetCelsiusValue(i * 0.5);
+        hour->SetWebsiteUrl("http://example.com/hour/" + std::to_string(i));
+        hourly->push_back(hour);
+    }
+    city->SetHourlyPtrVector(hourly);
+
+    ExtraPtr extra = std::make_shared<Extra>();
+    extra->SetHumidity(60 + seed);
+    extra->SetSunsetTime(1700050000);
+    extra->SetSunriseTime(1700010000);
+    extra->SetPm25(11);
+    extra->SetPm10(12);
+    extra->SetAqi(13);
+    extra->SetUvIndex(4);
+    extra->SetOutdoorExcercise(1);
+    extra->SetComfort(2);
+    extra->SetClothing(3);
+    extra->SetSkincare(4);
+    extra->SetCarwash(5);
+    extra->SetFoodPoison(6);
+    extra->SetHeat(7);
+    extra->SetSpoiledFood(8);
+    extra->SetDiscomfort(9);
+    extra->SetFrozenPipes(10);
+    extra->SetFrostbite(11);
+    extra->SetCold(12);
+    extra->SetPollen(13);
+    extra->SetAirDust(14);
+    extra->SetDrySkin(15);
+    extra->GetRealfeel()->SetCelsiusValue(999.0);
+    extra->GetPrecipitationPtr()->SetPrecType(2);
+    extra->GetPrecipitationPtr()->SetPrecProbability(0.35);
+    extra->GetPrecipitationPtr()->SetPrecAmount(1.234);
+    extra->GetPrecipitationPtr()->SetPrecProbabilityNight(0.75);
+    extra->GetPrecipitationPtr()->SetPrecAmountNight(2.5);
+    city->SetExtraPtr(extra);
+
+    MoonPhasePtrVectorPtr moon = std::make_shared<MoonPhasePtrVector>();
+    for (int i = 0; i < 3; ++i)
+    {
+        MoonPhasePtr phase = std::make_shared<MoonPhase>();
+        phase->SetLocationID(locationId);
+        phase->SetDate(1700000000 + i * 86400);
+        phase->SetMoonRiseTime(1700020000 + i * 86400);
+        phase->SetMoonSetTime(1700060000 + i * 86400);
+        phase->SetPhaseText("phase " + std::to_string(i));
+        phase->SetAge(i + 1);
+        moon->push_back(phase);
+    }
+    city->SetMoonPhasePtrVector(moon);
+    return city;
+}
+
+RawDB::RawDB(const std::string& path)
+{
+    if (sqlite3_open_v2(path.c_str(), &mDB, SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE, nullptr) != SQLITE_OK)
+        ADD_FAILURE() << "cannot open " << path;
+}
+
+RawDB::~RawDB()
+{
+    sqlite3_close(mDB);
+}
+
+bool RawDB::Exec(const std::string& sql)
+{
+    char* error = nullptr;
+    int rc = sqlite3_exec(mDB, sql.c_str(), nullptr, nullptr, &error);
+    if (rc != SQLITE_OK)
+        ADD_FAILURE() << sql << ": " << (error ? error : "");
+    sqlite3_free(error);
+    return rc == SQLITE_OK;
+}
+
+std::vector<std::string> RawDB::Column(const std::string& sql)
+{
+    std::vector<std::string> values;
+    sqlite3_stmt* stmt = nullptr;
+    if (sqlite3_prepare_v2(mDB, sql.c_str(), -1, &stmt, nullptr) != SQLITE_OK)
+    {
+        ADD_FAILURE() << sql << ": " << sqlite3_errmsg(mDB);
+        return values;
+    }
+    while (sqlite3_step(stmt) == SQLITE_ROW)
+    {
+        const unsigned char* text = sqlite3_column_text(stmt, 0);
+        values.push_back(text ? reinterpret_cast<const char*>(text) : "");
+    }
+    sqlite3_finalize(stmt);
+    return values;
+}
+
+int64_t RawDB::Int(const std::string& sql)
+{
+    std::vector<std::string> values = Column(sql);
+    return values.empty() ? -999999 : std::stoll(values[0]);
+}
+
+}  // namespace WeatherTest
