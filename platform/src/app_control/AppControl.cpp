@@ -145,7 +145,12 @@ extern "C" int app_control_add_extra_data(app_control_h appControl, const char* 
         return APP_CONTROL_ERROR_INVALID_PARAMETER;
     if (IsSystemKey(key))
         return APP_CONTROL_ERROR_KEY_REJECTED;
-    bundle_del(&appControl->extra, key);
+    // A repeated key keeps its place in the order of the extra data.
+    if (keyval_t* existing = const_cast<keyval_t*>(platform::BundleFind(&appControl->extra, key)))
+    {
+        existing->value = value;
+        return APP_CONTROL_ERROR_NONE;
+    }
     int result = bundle_add_str(&appControl->extra, key, value);
     return result == BUNDLE_ERROR_NONE ? APP_CONTROL_ERROR_NONE : APP_CONTROL_ERROR_OUT_OF_MEMORY;
 }
