@@ -1,0 +1,166 @@
+#include "DBController.h"
+
+#include <gtest/gtest.h>
+
+#include <fstream>
+#include <functional>
+#include <random>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include "DBConnector.h"
+#include "DBTestSupport.h"
+#include "FileUtil.h"
+#include "WeatherDefine.h"
+
+using namespace NSWeather;
+using WeatherTest::MakeCity;
+using WeatherTest::RawDB;
+
+namespace
+{
+const char* const kReadFailure = "(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false) [return]";
+const char* const kWriteFailure = "(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false) [return]";
+
+struct Operation
+{
+    const char* name;
+    bool isReader;
+    // True when the operation returned its empty value.
+    std::function<bool(DBController&)> run;
+};
+
+std::vector<Operation> AllOperations()
+{
+    CityPtrVectorPtr two = std::make_shared<CityPtrVector>(CityPtrVector{MakeCity("X", 0), MakeCity("Y", 1)});
+    return {
+        {"Initialize", false, [](DBController& db) { return db.Initialize() == ERR_FAIL; }},
+        {"SelectAllCityData", true, [](DBController& db) { return !db.SelectAllCityData(); }},
+        {"SelectCityData(page)", true, [](DBController& db) { return !db.SelectCityData(0); }},
+        {"SelectCityData(id)", true, [](DBController& db) { return !db.SelectCityData(std::string("A")); }},
+        {"SelectAllLocationIDData", true, [](DBController& db) { return !db.SelectAllLocationIDData(); }},
+        {"SelectNeedToUpdateLocationIDData", true,
+         [](DBController& db) { return !db.SelectNeedToUpdateLocationIDData(); }},
+        {"GetNumberOfCities", true, [](DBController& db) { return db.GetNumberOfCities() == -1; }},
+        {"GetPageIndexOfCurrentCity", true, [](DBController& db) { return db.GetPageIndexOfCurrentCity() == -1; }},
+        {"GetPageIndexWithLocationID", true,
+         [](DBController& db) { return db.GetPageIndexWithLocationID("A") == -1; }},
+        {"GetLocationIdOfCurrentCity", true, [](DBController& db) { return db.GetLocationIdOfCurrentCity().empty(); }},
+        {"IsCurrentLocationExist", true, [](DBController& db) { return !db.IsCurrentLocationExist(); }},
+        {"InsertCityData", false, [](DBController& db) { return db.InsertCityData(MakeCity("A", 0)) == ERR_FAIL; }},
+        {"UpdateCityData", false, [](DBController& db) { return db.UpdateCityData(MakeCity("A", 0)) == ERR_FAIL; }},
+        {"UpdateOnlyWidgetReferenceCount", false,
+         [](DBController& db) { return db.UpdateOnlyWidgetReferenceCount("A", true) == ERR_FAIL; }},
+        {"UpdateOnlyMobileLink", false,
+         [](DBController& db) { return db.UpdateOnlyMobileLink(MakeCity("A", 0)) == ERR_FAIL; }},
+        {"ReorderCityData", false, [two](DBController& db) { return db.ReorderCityData(two) == ERR_FAIL; }},
+        {"DeleteCityData(page)", false, [](DBController& db) { return db.DeleteCityData(0) == ERR_FAIL; }},
+        {"DeleteCityData(id)", false,
+         [](DBController& db) { return db.DeleteCityData(std::string("A")) == ERR_FAIL; }},
+        {"DeleteAllCityData", false, [](DBController& db) { return db.DeleteAllCityData() == ERR_FAIL; }},
+        {"DeleteAllCityDataAndInsertCityPtrVector", false,
+         [two](DBController& db) { return db.DeleteAllCityDataAndInsertCityPtrVector(two) == ERR_FAIL; }},
+        {"UpdateOnlyMoonPhaseData", false,
+         [](DBController& db) { return db.UpdateOnlyMoonPhaseData(MakeCity("A", 0)) == ERR_FAIL; }},
+        {"DeleteUselessMoonPhaseData", false, [](DBController& db) { return db.DeleteUselessMoonPhaseData() == ERR_FAIL; }},
+        {"GetIsWeatherInfoExpired", true, [](DBController& db) { return !db.GetIsWeatherInfoExpired(); }},
+    };
+}
+
+class DBControllerBadInputTest : public WeatherTest::DBTest
+{
+protected:
+    // Every operation fails cleanly with its own log line and leaves the
+    // connector closed.
+    void ExpectEveryOperationFails()
+    {
+        DBController db;
+        for (const Operation& op : AllOperations())
+        {
+            mLog.Clear();
+            EXPECT_TRUE(op.run(db)) << op.name;
+            if (std::string(op.name) != "GetIsWeatherInfoExpired")
+                EXPECT_TRUE(mLog.Contains(op.isReader ? kReadFailure : kWriteFailure)) << op.name << mLog.Dump();
+            EXPECT_FALSE(DBConnector::GetInstance()->GetIsOpened()) << op.name;
+        }
+    }
+    void ReplaceWeatherDB(const std::string& content)
+    {
+        unlink(WeatherDBPath().c_str());
+        std::ofstream(WeatherDBPath(), std::ios::binary) << content;
+    }
+    std::string ReadWeatherDB()
+    {
+        std::ifstream in(WeatherDBPath(), std::ios::binary);
+        return std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
+    }
+};
+}  // namespace
+
+TEST_F(DBControllerBadInputTest, RandomBytesAreNeitherReadNorOverwritten)
+{
+    std::mt19937 random(7);
+    std::string bytes(8192, '\0');
+    for (char& c : bytes)
+        c = static_cast<char>(random());
+    ReplaceWeatherDB(bytes);
+    ExpectEveryOperationFails();
+    EXPECT_EQ(ReadWeatherDB(), bytes);
+}
+
+TEST_F(DBControllerBadInputTest, UnregisteredWeatherAppGivesAnEmptyPath)
+{
+    ASSERT_EQ(system(("rm -rf '" + mRoot.Path("apps/com.quorvex.weather-m") + "'").c_str()), 0);
+    FileUtil::ClearCache();
+    ExpectEveryOperationFails();
+    EXPECT_TRUE(mLog.Contains("(dbFilePath.empty()) [return]"));
+}
+
+TEST_F(DBControllerBadInputTest, DatabaseFolderThatCannotBeWritten)
+{
+    unlink(WeatherDBPath().c_str());
+    ASSERT_EQ(rmdir(DBDir().c_str()), 0);
+    // A plain file where the folder should be: nothing can be created below it.
+    std::ofstream(DBDir()) << "x";
+    ExpectEveryOperationFails();
+}
+
+TEST_F(DBControllerBadInputTest, ReadOnlyFolderWithoutADatabase)
+{
+    if (geteuid() == 0)
+        GTEST_SKIP() << "permissions do not bind root";
+    unlink(WeatherDBPath().c_str());
+    ASSERT_EQ(chmod(DBDir().c_str(), 0555), 0);
+    ExpectEveryOperationFails();
+}
+
+// A database of another program: the tables exist under our names but with
+// other columns. Nothing crashes, nothing of theirs is changed by reads.
+TEST_F(DBControllerBadInputTest, ForeignSchemaGivesEmptyResults)
+{
+    ReplaceWeatherDB("");
+    {
+        RawDB raw(WeatherDBPath());
+        raw.Exec("CREATE TABLE CITY_TABLE (name TEXT); INSERT INTO CITY_TABLE VALUES ('theirs'), ('also theirs');");
+        raw.Exec("CREATE TABLE notes (body TEXT); INSERT INTO notes VALUES ('keep');");
+    }
+    DBController db;
+    CityPtrVectorPtr cities = db.SelectAllCityData();
+    ASSERT_TRUE(cities);
+    EXPECT_TRUE(cities->empty());
+    EXPECT_FALSE(db.SelectCityData(0));
+    EXPECT_FALSE(db.SelectCityData(std::string("theirs")));
+    EXPECT_EQ(db.GetPageIndexOfCurrentCity(), -1);
+    EXPECT_EQ(db.GetLocationIdOfCurrentCity(), "");
+    EXPECT_FALSE(db.IsCurrentLocationExist());
+    EXPECT_EQ(*db.SelectAllLocationIDData(), (std::vector<std::string>{"", ""}));
+    EXPECT_TRUE(db.SelectNeedToUpdateLocationIDData()->empty());
+    db.InsertCityData(MakeCity("A", 0));
+    db.UpdateCityData(MakeCity("A", 0));
+    db.DeleteUselessMoonPhaseData();
+    EXPECT_TRUE(mLog.Contains("Fail: sqlite3_prepare_v2 Failed"));
+    EXPECT_FALSE(DBConnector::GetInstance()->GetIsOpened());
+    RawDB raw(WeatherDBPath());
+    EXPECT_EQ(raw.Column("SELECT name FROM CITY_TABLE;"), (std::vector<std::string>{"theirs", "also theirs"}));
+    EXPECT_EQ(raw.Column("SELECT body FROM notes;"), (std::vector<std::string>{"keep"}));
+}

@@ -1,0 +1,379 @@
+#include "DBController.h"
+
+#include <gtest/gtest.h>
+
+#include <ctime>
+
+#include "DBTestSupport.h"
+#include "SettingDBController.h"
+#include "WeatherDefine.h"
+
+using namespace NSWeather;
+using WeatherTest::MakeCity;
+using WeatherTest::RawDB;
+
+namespace
+{
+class DBControllerTest : public WeatherTest::DBTest
+{
+protected:
+    DBController mDB;
+
+    std::vector<std::string> PageOrder()
+    {
+        std::vector<std::string> ids;
+        CityPtrVectorPtr cities = mDB.SelectAllCityData();
+        for (const CityPtr& city : *cities)
+            ids.push_back(city->GetLocationId() + "@" + std::to_string(city->GetPageIndex()));
+        return ids;
+    }
+    void InsertCities(const std::vector<std::string>& ids)
+    {
+        for (size_t i = 0; i < ids.size(); ++i)
+            ASSERT_EQ(mDB.InsertCityData(MakeCity(ids[i], static_cast<int>(i))), ERR_OK) << mLog.Dump();
+    }
+};
+
+void ExpectTemperature(const TemperaturePtr& t, double celsius, double fahrenheit)
+{
+    ASSERT_TRUE(t);
+    EXPECT_DOUBLE_EQ(t->GetCelsius(), celsius);
+    EXPECT_DOUBLE_EQ(t->GetFahrenheit(), fahrenheit);
+}
+}  // namespace
+
+TEST_F(DBControllerTest, CityWithAllChildrenRoundTrips)
+{
+    CityPtr in = MakeCity("LOC1", 1);
+    ASSERT_EQ(mDB.InsertCityData(in), ERR_OK);
+    ASSERT_EQ(mDB.UpdateOnlyMoonPhaseData(in), ERR_OK);
+
+    CityPtr out = mDB.SelectCityData(std::string("LOC1"));
+    ASSERT_TRUE(out) << mLog.Dump();
+    EXPECT_EQ(out->GetPageIndex(), 0);
+    EXPECT_EQ(out->GetLocationId(), "LOC1");
+    EXPECT_EQ(out->GetCityName(), in->GetCityName());
+    EXPECT_EQ(out->GetCityNameEng(), in->GetCityNameEng());
+    EXPECT_EQ(out->GetCountryName(), in->GetCountryName());
+    EXPECT_EQ(out->GetCountryNameEng(), in->GetCountryNameEng());
+    EXPECT_EQ(out->GetWebsiteUrl(), in->GetWebsiteUrl());
+    EXPECT_FALSE(out->GetIsCurrentLocation());
+    EXPECT_TRUE(out->GetIsSummerTime());
+    EXPECT_FALSE(out->GetIsDayTime());
+    EXPECT_EQ(out->GetWidgetReferenceCount(), 1);
+    EXPECT_FALSE(out->GetNeedToUpdate());
+    EXPECT_DOUBLE_EQ(out->GetGmtOffset(), 6.5);
+    EXPECT_EQ(out->GetRefreshedTime(), 1700000001);
+    EXPECT_EQ(out->GetLocalTime(), 1700003601);
+
+    CurrentPtr current = out->GetCurrentPtr();
+    ASSERT_TRUE(current);
+    EXPECT_EQ(current->GetWeatherIcon(), 8);
+    EXPECT_EQ(current->GetWeatherStatus(), "Cloudy LOC1-1");
+    ExpectTemperature(current->GetCurTemperature(), 21.5, 70.7);
+    ExpectTemperature(current->GetLowTemperature(), 0.0, 32.0);
+    ExpectTemperature(current->GetHighTemperature(), 999.0, 999.0);
+    EXPECT_EQ(current->GetDate(), 1700000101);
+    EXPECT_EQ(current->GetWebsiteUrl(), "http://example.com/current/LOC1-1");
+
+    ASSERT_EQ(out->GetWeeklyPtrVector()->size(), 10u);
+    for (int i = 0; i < 10; ++i)
+    {
+        WeeklyPtr day = out->GetWeeklyPtrVector()->at(i);
+        EXPECT_EQ(day->GetWeatherIcon(), i + 1);
+        EXPECT_EQ(day->GetWeatherStatus(), "day " + std::to_string(i));
+        EXPECT_NEAR(day->GetLowTemperature()->GetCelsius(), -5.2 + i, 1e-9);
+        EXPECT_NEAR(day->GetHighTemperature()->GetCelsius(), 20.5 + i, 1e-9);
+        time_t date = 1700000000 + i * 86400;
+        EXPECT_EQ(day->GetDate(), date);
+        struct tm local = {};
+        localtime_r(&date, &local);
+        EXPECT_EQ(day->GetDayOfWeek(), local.tm_wday);
+        EXPECT_EQ(day->GetWebsiteUrl(), "http://example.com/day/" + std::to_string(i));
+    }
+
+    ExpectTemperature(out->GetWeeklyPtrVector()->at(0)->GetLowTemperature(), -5.2, 22.6);
+    ExpectTemperature(out->GetWeeklyPtrVector()->at(9)->GetHighTemperature(), 29.5, 85.1);
+
+    ASSERT_EQ(out->GetHourlyPtrVector()->size(), 24u);
+    HourlyPtr hour = out->GetHourlyPtrVector()->at(23);
+    EXPECT_EQ(hour->GetHour(), 1700000000 + 23 * 3600);
+    EXPECT_EQ(hour->GetWeatherIcon(), 53);
+    EXPECT_EQ(hour->GetWeatherStatus(), "hour 23");
+    ExpectTemperature(hour->GetCurTemperature(), 11.5, 52.7);
+    ExpectTemperature(hour->GetLowTemperature(), 999.0, 999.0);
+    EXPECT_EQ(hour->GetWebsiteUrl(), "http://example.com/hour/23");
+
+    ExtraPtr extra = out->GetExtraPtr();
+    ASSERT_TRUE(extra);
+    EXPECT_EQ(extra->GetHumidity(), 61);
+    EXPECT_EQ(extra->GetSunsetTime(), 1700050000);
+    EXPECT_EQ(extra->GetSunriseTime(), 1700010000);
+    const int indexes[] = {extra->GetPm25(),       extra->GetPm10(),        extra->GetAqi(),
+                           extra->GetUvIndex(),    extra->GetOutdoorExcercise(), extra->GetComfort(),
+                           extra->GetClothing(),   extra->GetSkincare(),    extra->GetCarwash(),
+                           extra->GetFoodPoison(), extra->GetHeat(),        extra->GetSpoiledFood(),
+                           extra->GetDiscomfort(), extra->GetFrozenPipes(), extra->GetFrostbite(),
+                           extra->GetCold(),       extra->GetPollen(),      extra->GetAirDust(),
+                           extra->GetDrySkin()};
+    const int expected[] = {11, 12, 13, 4, 1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12, 13, 14, 15};
+    for (size_t i = 0; i < sizeof(expected) / sizeof(expected[0]); ++i)
+        EXPECT_EQ(indexes[i], expected[i]) << i;
+    ExpectTemperature(extra->GetRealfeel(), 999.0, 999.0);
+    PrecipitationPtr prec = extra->GetPrecipitationPtr();
+    EXPECT_EQ(prec->GetPrecType(), 2);
+    EXPECT_DOUBLE_EQ(prec->GetPrecProbability(), 0.35);
+    EXPECT_DOUBLE_EQ(prec->GetPrecAmount(), 1.234);
+    EXPECT_DOUBLE_EQ(prec->GetPrecProbabilityNight(), 0.75);
+    EXPECT_DOUBLE_EQ(prec->GetPrecAmountNight(), 2.5);
+
+    ASSERT_EQ(out->GetMoonPhasePtrVector()->size(), 3u);
+    MoonPhasePtr moon = out->GetMoonPhasePtrVector()->at(2);
+    EXPECT_EQ(moon->GetLocationID(), "LOC1");
+    EXPECT_EQ(moon->GetDate(), 1700000000 + 2 * 86400);
+    EXPECT_EQ(moon->GetMoonRiseTime(), 1700020000 + 2 * 86400);
+    EXPECT_EQ(moon->GetMoonSetTime(), 1700060000 + 2 * 86400);
+    EXPECT_EQ(moon->GetPhaseText(), "phase 2");
+    EXPECT_EQ(moon->GetAge(), 3);
+}
+
+TEST_F(DBControllerTest, ChildRowsCarryTheCityKeyAndTheirIndex)
+{
+    InsertCities({"A", "B"});
+    RawDB raw(WeatherDBPath());
+    int64_t keyB = raw.Int("SELECT PK_ID FROM CITY_TABLE WHERE locationId = 'B';");
+    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) + ";"), 24);
+    std::vector<std::string> indexes =
+        raw.Column("SELECT hourlyIndex FROM HOURLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) +
+                   " ORDER BY hourlyIndex;");
+    ASSERT_EQ(indexes.size(), 24u);
+    EXPECT_EQ(indexes.front(), "0");
+    EXPECT_EQ(indexes.back(), "23");
+    EXPECT_EQ(raw.Column("SELECT curTemperature FROM CURRENT_WEATHER_TABLE;"),
+              (std::vector<std::string>{"21.5", "21.5"}));
+    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM WEEKLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) + ";"), 10);
+}
+
+TEST_F(DBControllerTest, EmptyTableGivesAnEmptyList)
+{
+    CityPtrVectorPtr cities = mDB.SelectAllCityData();
+    ASSERT_TRUE(cities);
+    EXPECT_TRUE(cities->empty());
+    EXPECT_EQ(mDB.GetNumberOfCities(), 0);
+    EXPECT_FALSE(mDB.SelectCityData(0));
+    EXPECT_FALSE(mDB.SelectCityData(std::string("")));
+    EXPECT_TRUE(mLog.Contains("(locationID.length() < 1) [return]"));
+    EXPECT_TRUE(mDB.SelectAllLocationIDData()->empty());
+    EXPECT_FALSE(mDB.IsCurrentLocationExist());
+    EXPECT_EQ(mDB.GetLocationIdOfCurrentCity(), "");
+}
+
+TEST_F(DBControllerTest, InitializeTwiceKeepsRows)
+{
+    InsertCities({"A"});
+    EXPECT_EQ(mDB.Initialize(), ERR_OK);
+    EXPECT_EQ(mDB.GetNumberOfCities(), 1);
+}
+
+TEST_F(DBControllerTest, UpdateRewritesInPlace)
+{
+    InsertCities({"A", "B"});
+    CityPtr city = MakeCity("B", 4);
+    city->SetPageIndex(-1);  // resolved from the location id
+    city->SetCityName("renamed");
+    city->SetWidgetReferenceCount(40);
+    city->GetCurrentPtr()->GetCurTemperature()->SetCelsiusValue(-3.05);
+    city->GetWeeklyPtrVector()->resize(12, city->GetWeeklyPtrVector()->at(0));
+    city->GetHourlyPtrVector()->resize(5);
+    city->GetExtraPtr()->SetHumidity(5);
+    ASSERT_EQ(mDB.UpdateCityData(city), ERR_OK);
+
+    CityPtr out = mDB.SelectCityData(1);
+    ASSERT_TRUE(out);
+    EXPECT_EQ(out->GetLocationId(), "B");
+    EXPECT_EQ(out->GetCityName(), "renamed");
+    EXPECT_EQ(out->GetWidgetReferenceCount(), 1);  // only its own update writes it
+    ExpectTemperature(out->GetCurrentPtr()->GetCurTemperature(), -3.0, 26.6);
+    EXPECT_EQ(out->GetWeeklyPtrVector()->size(), 10u);  // extra days are not stored
+    EXPECT_EQ(out->GetHourlyPtrVector()->size(), 5u);   // hourly list replaced
+    EXPECT_EQ(out->GetExtraPtr()->GetHumidity(), 5);
+    EXPECT_EQ(mDB.SelectCityData(0)->GetCityName(), "city A-0");
+}
+
+TEST_F(DBControllerTest, ShorterWeeklyListLeavesSurplusRows)
+{
+    InsertCities({"A"});
+    CityPtr city = MakeCity("A", 0);
+    city->GetWeeklyPtrVector()->resize(7);
+    city->GetWeeklyPtrVector()->at(6)->SetWeatherStatus("changed");
+    ASSERT_EQ(mDB.UpdateCityData(city), ERR_OK);
+    WeeklyPtrVectorPtr days = mDB.SelectCityData(0)->GetWeeklyPtrVector();
+    ASSERT_EQ(days->size(), 10u);
+    EXPECT_EQ(days->at(6)->GetWeatherStatus(), "changed");
+    EXPECT_EQ(days->at(7)->GetWeatherStatus(), "day 7");
+}
+
+TEST_F(DBControllerTest, DeleteRenumbersInInsertionOrder)
+{
+    InsertCities({"A", "B", "C"});
+    CityPtrVectorPtr cities = mDB.SelectAllCityData();
+    CityPtrVectorPtr reordered = std::make_shared<CityPtrVector>(CityPtrVector{cities->at(2), cities->at(0), cities->at(1)});
+    ASSERT_EQ(mDB.ReorderCityData(reordered), ERR_OK);
+    EXPECT_EQ(PageOrder(), (std::vector<std::string>{"C@0", "A@1", "B@2"}));
+
+    ASSERT_EQ(mDB.DeleteCityData(std::string("A")), ERR_OK);
+    EXPECT_EQ(PageOrder(), (std::vector<std::string>{"B@0", "C@1"}));
+    RawDB raw(WeatherDBPath());
+    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE;"), 48);
+    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM CURRENT_WEATHER_TABLE;"), 2);
+    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM EXTRA_WEATHER_TABLE;"), 2);
+
+    ASSERT_EQ(mDB.DeleteCityData(1), ERR_OK);
+    EXPECT_EQ(PageOrder(), (std::vector<std::string>{"B@0"}));
+    EXPECT_EQ(mDB.ReorderCityData(nullptr), ERR_FAIL);
+    EXPECT_TRUE(mLog.Contains("(!reorderPtrVector) [return]"));
+}
+
+TEST_F(DBControllerTest, NewCitiesGoToTheEnd)
+{
+    InsertCities({"A", "B", "C"});
+    CityPtr atFive = MakeCity("D", 3);
+    atFive->SetPageIndex(5);
+    ASSERT_EQ(mDB.InsertCityData(atFive), ERR_OK);
+    EXPECT_EQ(mDB.GetPageIndexWithLocationID("D"), 5);
+    CityPtr atZero = MakeCity("E", 4);
+    ASSERT_EQ(mDB.InsertCityData(atZero), ERR_OK);
+    EXPECT_EQ(atZero->GetPageIndex(), 4);
+    EXPECT_EQ(mDB.GetPageIndexWithLocationID("E"), 4);
+}
+
+TEST_F(DBControllerTest, CurrentLocationIdCarriesOneSuffix)
+{
+    CityPtr here = MakeCity("HERE", 0, true);
+    ASSERT_EQ(mDB.InsertCityData(here), ERR_OK);
+    EXPECT_EQ(here->GetLocationId(), "HERE:C");
+    CityPtr there = MakeCity("THERE:C", 1, true);
+    ASSERT_EQ(mDB.InsertCityData(there), ERR_OK);
+    ASSERT_EQ(mDB.InsertCityData(MakeCity("PLAIN", 2)), ERR_OK);
+    EXPECT_TRUE(mLog.Contains("(cityPtr->GetIsCurrentLocation() == false) [break]"));
+    EXPECT_EQ(*mDB.SelectAllLocationIDData(), (std::vector<std::string>{"HERE:C", "THERE:C", "PLAIN"}));
+    EXPECT_TRUE(mDB.IsCurrentLocationExist());
+    EXPECT_EQ(mDB.GetPageIndexOfCurrentCity(), 0);
+    EXPECT_EQ(mDB.GetLocationIdOfCurrentCity(), "HERE:C");
+
+    CityPtr update = MakeCity("HERE", 5, true);
+    ASSERT_EQ(mDB.UpdateCityData(update), ERR_OK);
+    EXPECT_EQ(update->GetLocationId(), "HERE:C");
+    EXPECT_EQ(mDB.SelectCityData(0)->GetLocationId(), "HERE:C");
+}
+
+TEST_F(DBControllerTest, SameCityIsStoredOnce)
+{
+    InsertCities({"A"});
+    EXPECT_EQ(mDB.InsertCityData(MakeCity("A", 9)), ERR_FAIL);
+    EXPECT_TRUE(mLog.Contains("There is a same city in DB"));
+    EXPECT_EQ(mDB.GetNumberOfCities(), 1);
+    EXPECT_EQ(mDB.SelectCityData(0)->GetCityName(), "city A-0");
+
+    // The current-location twin of a city is another city (its id gets ":C").
+    EXPECT_EQ(mDB.InsertCityData(MakeCity("A", 9, true)), ERR_OK);
+    EXPECT_EQ(mDB.GetNumberOfCities(), 2);
+}
+
+TEST_F(DBControllerTest, ReferenceCountNeverDropsBelowZero)
+{
+    CityPtr city = MakeCity("A", 0);
+    ASSERT_EQ(mDB.InsertCityData(city), ERR_OK);
+    EXPECT_EQ(mDB.UpdateOnlyWidgetReferenceCount("A", true), ERR_OK);
+    EXPECT_EQ(mDB.SelectCityData(0)->GetWidgetReferenceCount(), 1);
+    EXPECT_TRUE(mLog.Contains("query : UPDATE CITY_TABLE SET widgetReferenceCount = ? WHERE locationId = ?; [1]"));
+    mDB.UpdateOnlyWidgetReferenceCount("A", false);
+    mDB.UpdateOnlyWidgetReferenceCount("A", false);
+    EXPECT_EQ(mDB.SelectCityData(0)->GetWidgetReferenceCount(), 0);
+    EXPECT_EQ(mDB.UpdateOnlyWidgetReferenceCount("missing", true), ERR_FAIL);
+}
+
+TEST_F(DBControllerTest, MobileLinkAndNeedToUpdateList)
+{
+    InsertCities({"A", "B", "C", "D"});  // seeds 0 and 3 need an update
+    CityPtr link = MakeCity("C", 0);
+    link->SetPageIndex(-1);
+    link->SetWebsiteUrl("http://new.example.com/");
+    ASSERT_EQ(mDB.UpdateOnlyMobileLink(link), ERR_OK);
+    EXPECT_EQ(mDB.SelectCityData(2)->GetWebsiteUrl(), "http://new.example.com/");
+    EXPECT_EQ(mDB.SelectCityData(2)->GetCityName(), "city C-2");
+    EXPECT_EQ(*mDB.SelectNeedToUpdateLocationIDData(), (std::vector<std::string>{"A", "D"}));
+}
+
+TEST_F(DBControllerTest, DeleteAllAndReplace)
+{
+    InsertCities({"A", "B"});
+    CityPtrVectorPtr next = std::make_shared<CityPtrVector>(
+        CityPtrVector{MakeCity("X", 0), MakeCity("Y", 1), nullptr, MakeCity("X", 2)});
+    ASSERT_EQ(mDB.DeleteAllCityDataAndInsertCityPtrVector(next), ERR_OK);
+    EXPECT_EQ(PageOrder(), (std::vector<std::string>{"X@0", "Y@1"}));
+    EXPECT_TRUE(mLog.Contains("There is a same city in DB"));
+    EXPECT_EQ(RawDB(WeatherDBPath()).Int("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE;"), 48);
+
+    ASSERT_EQ(mDB.DeleteAllCityData(), ERR_OK);
+    EXPECT_TRUE(mLog.Contains("DeleteAllCityData"));
+    RawDB raw(WeatherDBPath());
+    for (const char* table : {"CITY_TABLE", "CURRENT_WEATHER_TABLE", "WEEKLY_WEATHER_TABLE", "HOURLY_WEATHER_TABLE",
+                              "EXTRA_WEATHER_TABLE"})
+        EXPECT_EQ(raw.Int(std::string("SELECT COUNT(*) FROM ") + table + ";"), 0) << table;
+}
+
+TEST_F(DBControllerTest, UselessMoonPhasesAreRemoved)
+{
+    EXPECT_EQ(mDB.DeleteUselessMoonPhaseData(), ERR_OK);
+    EXPECT_TRUE(mLog.Contains("(moonPhaseLocIdVector.size() < 1) [return]"));
+
+    CityPtr a = MakeCity("A", 0);
+    CityPtr b = MakeCity("B", 1);
+    InsertCities({"A", "B"});
+    mDB.UpdateOnlyMoonPhaseData(a);
+    mDB.UpdateOnlyMoonPhaseData(b);
+    mDB.UpdateOnlyMoonPhaseData(b);  // replaces, does not add
+    RawDB raw(WeatherDBPath());
+    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM MOON_PHASE_TABLE;"), 6);
+
+    mDB.DeleteCityData(std::string("A"));
+    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM MOON_PHASE_TABLE;"), 6);
+    ASSERT_EQ(mDB.DeleteUselessMoonPhaseData(), ERR_OK);
+    EXPECT_EQ(raw.Column("SELECT DISTINCT locationID FROM MOON_PHASE_TABLE;"), (std::vector<std::string>{"B"}));
+    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM MOON_PHASE_TABLE;"), 3);
+}
+
+TEST_F(DBControllerTest, ExpiryFollowsTheOldestRefreshAndTheInterval)
+{
+    EXPECT_FALSE(mDB.GetIsWeatherInfoExpired());
+    EXPECT_TRUE(mLog.Contains("(!settingPtr) [return]"));
+    ASSERT_EQ(SettingDBController().Initialize(), ERR_OK);  // interval 6 hours
+    EXPECT_FALSE(mDB.GetIsWeatherInfoExpired());
+    EXPECT_TRUE(mLog.Contains("(cityPtrVector->size() == 0) [return]"));
+
+    time_t now = time(nullptr);
+    CityPtr fresh = MakeCity("A", 0);
+    fresh->SetRefreshedTime(now - 60);
+    CityPtr older = MakeCity("B", 1);
+    older->SetRefreshedTime(now - 5 * 3600);
+    mDB.InsertCityData(fresh);
+    mDB.InsertCityData(older);
+    EXPECT_FALSE(mDB.GetIsWeatherInfoExpired());
+    EXPECT_TRUE(mLog.Contains("timeInterval [21600]"));
+
+    CityPtr stale = MakeCity("C", 2);
+    stale->SetRefreshedTime(now - 7 * 3600);
+    mDB.InsertCityData(stale);
+    EXPECT_TRUE(mDB.GetIsWeatherInfoExpired());
+    EXPECT_TRUE(mLog.Contains("lastRefreshedTime [" + std::to_string(now - 7 * 3600) + "]"));
+}
+
+TEST_F(DBControllerTest, RefreshTimeAheadOfTheClockCountsAsExpired)
+{
+    ASSERT_EQ(SettingDBController().Initialize(), ERR_OK);
+    CityPtr future = MakeCity("A", 0);
+    future->SetRefreshedTime(time(nullptr) + 24 * 3600);
+    mDB.InsertCityData(future);
+    EXPECT_TRUE(mDB.GetIsWeatherInfoExpired());
+}
