@@ -1,0 +1,139 @@
+#include <quorvex_log_manager.h>
+
+#include <Ecore.h>
+#include <gtest/gtest.h>
+
+#include <fstream>
+#include <sstream>
+#include <string>
+#include <vector>
+
+#include "TestPlatform.h"
+
+namespace
+{
+
+struct Completion
+{
+    int requestId;
+    std::string uri;
+};
+
+void CompletedCb(int requestId, const char* uri, void* data)
+{
+    static_cast<std::vector<Completion>*>(data)->push_back({requestId, uri});
+}
+
+// Runs the main loop for one short moment: jobs and idlers get their turn.
+void Spin(double seconds)
+{
+    ecore_timer_add(
+        seconds,
+        [](void*) -> Eina_Bool {
+            ecore_main_loop_quit();
+            return ECORE_CALLBACK_CANCEL;
+        },
+        nullptr);
+    ecore_main_loop_begin();
+}
+
+class UsageLogClientTest : public WeatherTest::PlatformTest
+{
+protected:
+    void SetUp() override
+    {
+        ecore_init();
+        ASSERT_EQ(QUORVEX_LOG_MANAGER_ERROR_NONE, quorvex_log_manager_create(&mManager));
+        mData = bundle_create();
+    }
+
+    void TearDown() override
+    {
+        bundle_free(mData);
+        if (mManager)
+            quorvex_log_manager_destroy(mManager);
+        ecore_shutdown();
+    }
+
+    std::vector<std::string> Records() const
+    {
+        std::ifstream file(mRoot.Path("log/usage.log"));
+        std::vector<std::string> lines;
+        std::string line;
+        while (std::getline(file, line))
+            lines.push_back(line);
+        return lines;
+    }
+
+    quorvex_log_manager_h mManager = nullptr;
+    bundle* mData = nullptr;
+    std::vector<Completion> mCompleted;
+};
+
+TEST_F(UsageLogClientTest, RecordIsStoredAndCompletionArrivesOnTheLoop)
+{
+    bundle_add_str(mData, "app_id", "com.quorvex.weather-m");
+    bundle_add_str(mData, "extra", "say \"hi\"");
+    int first = quorvex_log_manager_insert(mManager, "content://a/log/x", mData, CompletedCb, &mCompleted);
+    int second = quorvex_log_manager_insert(mManager, "content://a/log/y", mData, CompletedCb, &mCompleted);
+    ASSERT_GT(first, 0);
+    EXPECT_GT(second, first);
+    EXPECT_TRUE(mCompleted.empty());
+
+    std::vector<std::string> records = Records();
+    ASSERT_EQ(2u, records.size());
+    EXPECT_EQ("{\"request_id\":" + std::to_string(first) +
+                  ",\"uri\":\"content://a/log/x\",\"data\":{\"app_id\":\"com.quorvex.weather-m\","
+                  "\"extra\":\"say \\\"hi\\\"\"}}",
+              records[0]);
+
+    Spin(0.05);
+    ASSERT_EQ(2u, mCompleted.size());
+    EXPECT_EQ(first, mCompleted[0].requestId);
+    EXPECT_EQ("content://a/log/x", mCompleted[0].uri);
+    EXPECT_EQ(second, mCompleted[1].requestId);
+}
+
+TEST_F(UsageLogClientTest, EmptyUriOrRecordIsRefused)
+{
+    EXPECT_EQ(QUORVEX_LOG_MANAGER_ERROR_INVALID_PARAMETER,
+              quorvex_log_manager_insert(mManager, "content://a", mData, CompletedCb, &mCompleted));
+    bundle_add_str(mData, "k", "v");
+    EXPECT_EQ(QUORVEX_LOG_MANAGER_ERROR_INVALID_PARAMETER,
+              quorvex_log_manager_insert(mManager, "", mData, CompletedCb, &mCompleted));
+    EXPECT_EQ(QUORVEX_LOG_MANAGER_ERROR_INVALID_PARAMETER,
+              quorvex_log_manager_insert(nullptr, "content://a", mData, nullptr, nullptr));
+    EXPECT_EQ(QUORVEX_LOG_MANAGER_ERROR_INVALID_PARAMETER,
+              quorvex_log_manager_insert(mManager, "content://a", nullptr, nullptr, nullptr));
+    EXPECT_TRUE(mLog.Contains("rejected a record", "USAGE_LOG"));
+    Spin(0.05);
+    EXPECT_TRUE(Records().empty());
+    EXPECT_TRUE(mCompleted.empty());
+}
+
+TEST_F(UsageLogClientTest, DestroyDropsPendingCompletions)
+{
+    bundle_add_str(mData, "k", "v");
+    ASSERT_GT(quorvex_log_manager_insert(mManager, "content://a", mData, CompletedCb, &mCompleted), 0);
+    ASSERT_GT(quorvex_log_manager_insert(mManager, "content://a", mData, nullptr, nullptr), 0);
+    EXPECT_EQ(QUORVEX_LOG_MANAGER_ERROR_NONE, quorvex_log_manager_destroy(mManager));
+    mManager = nullptr;
+    Spin(0.05);
+    EXPECT_TRUE(mCompleted.empty());
+    EXPECT_EQ(2u, Records().size());
+}
+
+TEST_F(UsageLogClientTest, UnwritableLogIsAnIoError)
+{
+    bundle_add_str(mData, "k", "v");
+    // A folder where the log file should be.
+    std::string logPath = mRoot.Path("log/usage.log");
+    ASSERT_EQ(0, system(("mkdir -p '" + logPath + "'").c_str()));
+    EXPECT_EQ(QUORVEX_LOG_MANAGER_ERROR_IO_ERROR,
+              quorvex_log_manager_insert(mManager, "content://a", mData, CompletedCb, &mCompleted));
+    EXPECT_TRUE(mLog.Contains("cannot write the usage log", "USAGE_LOG"));
+    Spin(0.05);
+    EXPECT_TRUE(mCompleted.empty());
+}
+
+}  // namespace
