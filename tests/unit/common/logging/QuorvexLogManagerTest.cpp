@@ -1,0 +1,166 @@
+#include "QuorvexLogManager.h"
+
+#include <Ecore.h>
+#include <gtest/gtest.h>
+
+#include <climits>
+#include <fstream>
+#include <string>
+#include <vector>
+
+#include "TestPlatform.h"
+
+using NSWeather::QuorvexLogManager;
+
+namespace
+{
+
+const std::string kFeatureUri = "content://" QUORVEX_LOG_AUTHORITY "/log/use_app_feature_survey";
+const std::string kStatusUri = "content://" QUORVEX_LOG_AUTHORITY "/log/report_app_status_survey";
+
+struct Record
+{
+    std::string uri;
+    std::string data;
+};
+
+// Splits {"request_id":N,"uri":"...","data":{...}} into its uri and data.
+Record Parse(const std::string& line)
+{
+    size_t uriAt = line.find("\"uri\":\"") + 7;
+    size_t uriEnd = line.find("\",\"data\":", uriAt);
+    size_t dataAt = uriEnd + 9;
+    return {line.substr(uriAt, uriEnd - uriAt), line.substr(dataAt, line.size() - dataAt - 1)};
+}
+
+std::string Data(const std::string& feature, const std::string& extra, const std::string& value)
+{
+    return "{\"app_id\":\"com.quorvex.weather-m\",\"feature\":\"" + feature + "\",\"extra\":\"" + extra +
+           "\",\"value\":\"" + value + "\"}";
+}
+
+class QuorvexLogManagerTest : public WeatherTest::PlatformTest
+{
+protected:
+    void SetUp() override { ecore_init(); }
+
+    void TearDown() override
+    {
+        // The manager is process-wide; leave it without a handle.
+        QuorvexLogManager::GetInstance()->Destroy();
+        ecore_shutdown();
+    }
+
+    std::vector<Record> Records() const
+    {
+        std::ifstream file(mRoot.Path("log/usage.log"));
+        std::vector<Record> records;
+        std::string line;
+        while (std::getline(file, line))
+            records.push_back(Parse(line));
+        return records;
+    }
+
+    QuorvexLogManager* mManager = QuorvexLogManager::GetInstance();
+};
+
+TEST_F(QuorvexLogManagerTest, NothingIsSentBeforeCreate)
+{
+    mManager->CollectLogByFeature(2005, 10, 0);
+    EXPECT_TRUE(mLog.Contains("(mQuorvexLogManager == NULL) [return]", "weather-common")) << mLog.Dump();
+    EXPECT_TRUE(Records().empty());
+
+    mManager->Create();
+    mManager->Destroy();
+    mManager->CollectLogByFeature(2005, 10, 0);
+    EXPECT_TRUE(Records().empty());
+}
+
+TEST_F(QuorvexLogManagerTest, CreateTwiceKeepsTheFirstHandle)
+{
+    mManager->Create();
+    mManager->Create();
+    EXPECT_TRUE(mLog.Contains("(mQuorvexLogManager != NULL) [return]", "weather-common"));
+    mManager->CollectLogByFeature(2008, 13, 1);
+    EXPECT_EQ(1u, Records().size());
+}
+
+TEST_F(QuorvexLogManagerTest, RecordsCarryTheirKeysAndValues)
+{
+    mManager->Create();
+    mManager->CollectLogByFeature(2005, 10, 0);
+    mManager->CollectLogByFeature(2008, 15, 1, -1);
+    mManager->CollectLogByFeature(2008, 14, 1);
+    mManager->CollectLogByFeature(2009, 16, 0, 1);
+    mManager->CollectLogByFeature(2009, 16, 0, 0);
+    mManager->CollectLogByFeature(1, 0, 0, 7);
+    mManager->CollectLogByFeature(1, 0, 0, INT_MAX);
+
+    std::vector<Record> records = Records();
+    ASSERT_EQ(7u, records.size());
+    EXPECT_EQ(kFeatureUri, records[0].uri);
+    EXPECT_EQ(Data("2005", "enter_accuweather", "0"), records[0].data);
+    EXPECT_EQ(kStatusUri, records[1].uri);
+    EXPECT_EQ(Data("2008", "added_widget_4x2", "0"), records[1].data);
+    EXPECT_EQ(Data("2008", "added_widget_4x4", "0"), records[2].data);
+    EXPECT_EQ(kFeatureUri, records[3].uri);
+    EXPECT_EQ(Data("2009", "widget_alive", "1000"), records[3].data);
+    EXPECT_EQ(Data("2009", "widget_alive", "0"), records[4].data);
+    EXPECT_EQ(Data("1", "use_current_location_option", "7000"), records[5].data);
+    // Too large to scale: capped instead of overflowing.
+    EXPECT_EQ(Data("1", "use_current_location_option", "2147483000"), records[6].data);
+}
+
+TEST_F(QuorvexLogManagerTest, UnknownDetailSendsAnEmptyExtra)
+{
+    mManager->Create();
+    mManager->CollectLogByFeature(2008, 17, 1);
+    mManager->CollectLogByFeature(2008, -1, 1);
+    std::vector<Record> records = Records();
+    ASSERT_EQ(2u, records.size());
+    EXPECT_EQ(Data("2008", "", "0"), records[0].data);
+    EXPECT_TRUE(mLog.Contains("Default error : 17"));
+    EXPECT_TRUE(mLog.Contains("Default error : -1"));
+}
+
+TEST_F(QuorvexLogManagerTest, DetailNamesFollowTheTable)
+{
+    const char* const names[] = {"use_current_location_option", "use_current_location_button_click",
+                                 "search_city_list_click", "forecast_hourly_click", "forecast_daily_click",
+                                 "auto_refresh_option_every_1_hour", "auto_refresh_option_every_3_hours",
+                                 "auto_refresh_option_every_6_hours", "auto_refresh_option_every_12_hours",
+                                 "auto_refresh_option_never", "enter_accuweather", "use_lock_screen_option",
+                                 "number_of_registered_city", "widget_empty", "added_widget_4x4",
+                                 "added_widget_4x2", "widget_alive"};
+    for (int i = 0; i < 17; ++i)
+        EXPECT_EQ(names[i], QuorvexLogManager::GetExtraStringByDetailFeatureNumber(i)) << i;
+    EXPECT_EQ("", QuorvexLogManager::GetUri(2));
+    EXPECT_EQ("", QuorvexLogManager::GetUri(-1));
+}
+
+TEST_F(QuorvexLogManagerTest, UnknownUriTypeIsNotStored)
+{
+    mManager->Create();
+    mManager->CollectLogByFeature(2005, 10, 2);
+    EXPECT_TRUE(Records().empty());
+    EXPECT_TRUE(mLog.Contains("quorvex_log_manager_insert failed : -22", "weather-common")) << mLog.Dump();
+}
+
+TEST_F(QuorvexLogManagerTest, CompletionIsLoggedOnTheMainLoop)
+{
+    mManager->Create();
+    mManager->CollectLogByFeature(2005, 10, 0);
+    EXPECT_FALSE(mLog.Contains("completed"));
+    ecore_timer_add(
+        0.05,
+        [](void*) -> Eina_Bool {
+            ecore_main_loop_quit();
+            return ECORE_CALLBACK_CANCEL;
+        },
+        nullptr);
+    ecore_main_loop_begin();
+    EXPECT_TRUE(mLog.Contains("completed, uri:" + kFeatureUri, "weather-common")) << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("Insert request:"));
+}
+
+}  // namespace
