@@ -1,0 +1,112 @@
+#include "widget/ControlClient.h"
+
+#include <cerrno>
+#include <chrono>
+#include <cstring>
+#include <poll.h>
+#include <sys/socket.h>
+#include <sys/un.h>
+#include <unistd.h>
+
+#include "core/PlatformRoot.h"
+
+namespace platform
+{
+
+namespace
+{
+double Now()
+{
+    using namespace std::chrono;
+    return duration<double>(steady_clock::now().time_since_epoch()).count();
+}
+}  // namespace
+
+ControlClient::~ControlClient()
+{
+    Disconnect();
+}
+
+std::string ControlClient::SocketPath(const std::string& widgetId)
+{
+    return RootPath("run/widget/" + widgetId + ".ctl");
+}
+
+bool ControlClient::Connect(const std::string& socketPath)
+{
+    Disconnect();
+    sockaddr_un address;
+    memset(&address, 0, sizeof(address));
+    address.sun_family = AF_UNIX;
+    if (socketPath.size() >= sizeof(address.sun_path))
+        return false;
+    memcpy(address.sun_path, socketPath.c_str(), socketPath.size() + 1);
+    mFd = socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0);
+    if (mFd >= 0 && connect(mFd, reinterpret_cast<sockaddr*>(&address), sizeof(address)) == 0)
+        return true;
+    Disconnect();
+    return false;
+}
+
+void ControlClient::Disconnect()
+{
+    if (mFd >= 0)
+        close(mFd);
+    mFd = -1;
+    mBuffer.clear();
+}
+
+bool ControlClient::ReadLine(std::string& line, double deadline)
+{
+    while (true)
+    {
+        size_t end = mBuffer.find('\n');
+        if (end != std::string::npos)
+        {
+            line = mBuffer.substr(0, end);
+            mBuffer.erase(0, end + 1);
+            return true;
+        }
+        double left = deadline - Now();
+        if (left <= 0)
+            return false;
+        pollfd waitFor = {mFd, POLLIN, 0};
+        int ready = poll(&waitFor, 1, static_cast<int>(left * 1000) + 1);
+        if (ready < 0 && errno == EINTR)
+            continue;
+        if (ready <= 0)
+            return false;
+        char chunk[4096];
+        ssize_t got = read(mFd, chunk, sizeof(chunk));
+        if (got <= 0)
+            return false;
+        mBuffer.append(chunk, static_cast<size_t>(got));
+    }
+}
+
+bool ControlClient::Request(const std::string& command, std::string& reply, double timeoutSeconds)
+{
+    reply.clear();
+    if (mFd < 0 || command.find('\n') != std::string::npos)
+        return false;
+    std::string line = command + "\n";
+    if (send(mFd, line.data(), line.size(), MSG_NOSIGNAL) != static_cast<ssize_t>(line.size()))
+        return false;
+    double deadline = Now() + timeoutSeconds;
+    if (!ReadLine(reply, deadline))
+        return false;
+    bool isList = command.compare(0, 4, "list") == 0 && (command.size() == 4 || isspace(command[4]));
+    if (!isList || reply.compare(0, 3, "OK ") != 0)
+        return true;
+    long count = strtol(reply.c_str() + 3, nullptr, 10);
+    for (long i = 0; i < count; ++i)
+    {
+        std::string entry;
+        if (!ReadLine(entry, deadline))
+            return false;
+        reply += "\n" + entry;
+    }
+    return true;
+}
+
+}  // namespace platform

@@ -1,0 +1,144 @@
+#include "widget/WidgetInstance.h"
+
+#include <Elementary.h>
+
+#include "dlog.h"
+
+namespace platform
+{
+
+namespace
+{
+const char* const kLogTag = "widget-host";
+}
+
+const char* WidgetInstanceStateName(WidgetInstanceState state)
+{
+    switch (state)
+    {
+    case WidgetInstanceState::Created:
+        return "created";
+    case WidgetInstanceState::Running:
+        return "running";
+    case WidgetInstanceState::Paused:
+        return "paused";
+    case WidgetInstanceState::Destroyed:
+        return "destroyed";
+    }
+    return "unknown";
+}
+
+WidgetInstance::WidgetInstance(const std::string& id, int sizeType, int width, int height)
+    : mId(id), mSizeType(sizeType), mWidth(width), mHeight(height)
+{
+}
+
+WidgetInstance::~WidgetInstance()
+{
+    if (mWindow)
+    {
+        evas_object_event_callback_del_full(mWindow, EVAS_CALLBACK_DEL, WindowDelCb, this);
+        evas_object_del(mWindow);
+    }
+    if (mParentObject)
+        evas_object_event_callback_del_full(mParentObject, EVAS_CALLBACK_DEL, ParentDelCb, this);
+    if (mParentCanvas)
+        ecore_evas_free(mParentCanvas);
+    if (mPendingContent)
+        bundle_free(mPendingContent);
+}
+
+void WidgetInstance::SetPendingUpdate(bundle* content)
+{
+    if (mPendingContent)
+        bundle_free(mPendingContent);
+    mPendingContent = content;
+    mIsUpdatePending = true;
+}
+
+bundle* WidgetInstance::TakePendingUpdate()
+{
+    bundle* content = mPendingContent;
+    mPendingContent = nullptr;
+    mIsUpdatePending = false;
+    return content;
+}
+
+void WidgetInstance::SetSize(int sizeType, int width, int height)
+{
+    mSizeType = sizeType;
+    mWidth = width;
+    mHeight = height;
+    if (mParentObject)
+        evas_object_resize(mParentObject, width, height);
+    if (mWindow)
+        evas_object_resize(mWindow, width, height);
+}
+
+Evas_Object* WidgetInstance::GetParentObject()
+{
+    if (mParentObject)
+        return mParentObject;
+    if (!mParentCanvas)
+        mParentCanvas = ecore_evas_buffer_new(mWidth, mHeight);
+    if (!mParentCanvas)
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "no off-screen canvas for %s", mId.c_str());
+        return nullptr;
+    }
+    mParentObject = evas_object_rectangle_add(ecore_evas_get(mParentCanvas));
+    evas_object_color_set(mParentObject, 0, 0, 0, 0);
+    evas_object_resize(mParentObject, mWidth, mHeight);
+    evas_object_event_callback_add(mParentObject, EVAS_CALLBACK_DEL, ParentDelCb, this);
+    return mParentObject;
+}
+
+bool WidgetInstance::OwnsCanvas(const Evas* canvas) const
+{
+    return canvas && mParentCanvas && ecore_evas_get(mParentCanvas) == canvas;
+}
+
+Evas_Object* WidgetInstance::CreateWindow(const char* name)
+{
+    if (mWindow)
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "instance %s already has a window", mId.c_str());
+        return nullptr;
+    }
+    mWindow = elm_win_add(nullptr, name ? name : mId.c_str(), ELM_WIN_BASIC);
+    if (!mWindow)
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "elm_win_add failed for %s", mId.c_str());
+        return nullptr;
+    }
+    elm_win_title_set(mWindow, mId.c_str());
+    evas_object_resize(mWindow, mWidth, mHeight);
+    evas_object_event_callback_add(mWindow, EVAS_CALLBACK_DEL, WindowDelCb, this);
+    return mWindow;
+}
+
+Evas* WidgetInstance::GetWindowCanvas() const
+{
+    return mWindow ? evas_object_evas_get(mWindow) : nullptr;
+}
+
+void WidgetInstance::WindowDelCb(void* data, Evas*, Evas_Object*, void*)
+{
+    if (!data)
+        return;
+    static_cast<WidgetInstance*>(data)->OnWindowDeleted();
+}
+
+void WidgetInstance::ParentDelCb(void* data, Evas*, Evas_Object*, void*)
+{
+    if (!data)
+        return;
+    static_cast<WidgetInstance*>(data)->mParentObject = nullptr;
+}
+
+void WidgetInstance::OnWindowDeleted()
+{
+    mWindow = nullptr;
+}
+
+}  // namespace platform

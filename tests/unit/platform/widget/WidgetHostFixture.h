@@ -1,0 +1,50 @@
+#ifndef WEATHER_TESTS_WIDGET_HOST_FIXTURE_H
+#define WEATHER_TESTS_WIDGET_HOST_FIXTURE_H
+
+#include <sys/types.h>
+
+#include <string>
+#include <vector>
+
+#include "TestPlatform.h"
+#include "widget/ControlClient.h"
+
+namespace WeatherTest
+{
+
+// Runs the test widget application under the host on a fresh root and
+// talks to it through the control socket.
+class WidgetHostTest : public PlatformTest
+{
+protected:
+    static const char* const kWidgetId;
+
+    void TearDown() override;
+
+    // Starts the host with extra arguments and waits for its socket.
+    void StartHost(const std::vector<std::string>& args = {});
+    // Starts a second process without waiting; returns its pid.
+    pid_t Spawn(const std::vector<std::string>& args, const std::string& outputName);
+    // The reply to one command ("" when the host did not answer).
+    std::string Send(const std::string& command);
+    // "OK <id>" of a create, reduced to the id.
+    std::string CreateInstance(const std::string& size);
+    void WaitIdle();
+    // Waits for the host to end by itself; its exit status, or -1.
+    int WaitForExit(double seconds);
+
+    // The recorded callback lines, and those starting with `prefix`.
+    std::vector<std::string> Records() const;
+    std::vector<std::string> Records(const std::string& prefix) const;
+    std::string SocketPath() const;
+
+    pid_t mHostPid = -1;
+    platform::ControlClient mClient;
+};
+
+// Words of a line split at spaces.
+std::vector<std::string> Words(const std::string& line);
+
+}  // namespace WeatherTest
+
+#endif
