@@ -21,7 +21,7 @@ public:
     virtual ~SettingDBController();
 
     // Creates the table and the default row when either is missing.
-    // ERR_OK, or ERR_FAIL when the database cannot be opened.
+    // ERR_OK, or ERR_FAIL when the database cannot be opened or takes no row.
     int Initialize();
     bool IsSettingTableExist();
     void CreateTable();

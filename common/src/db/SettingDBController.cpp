@@ -59,12 +59,17 @@ int SettingDBController::Initialize()
 {
     DBConnector* dbConnector = DBConnector::GetInstance();
     COMMON_RETV_IF(dbConnector->DBInitialize(GetSettingDBFilePath(), false) == false, ERR_FAIL);
-    if (IsSettingTableExist() == false)
+    bool hasRow = IsSettingTableExist();
+    if (hasRow == false)
     {
         CreateTable();
         Insert(std::make_shared<Setting>());
+        // A file that is no database (or a foreign table) takes no row;
+        // say so instead of reporting a settings row that is not there.
+        hasRow = IsSettingTableExist();
     }
     dbConnector->DBFinalize();
+    COMMON_RETV_IF(hasRow == false, ERR_FAIL);
     return ERR_OK;
 }
 

@@ -2,6 +2,7 @@
 #define WEATHER_TESTS_SETTINGS_TEST_SUPPORT_H
 
 #include <string>
+#include <utility>
 #include <vector>
 
 #include <sqlite3.h>
@@ -37,6 +38,14 @@ public:
 private:
     sqlite3* mHandle = nullptr;
 };
+
+// "CREATE TABLE IF NOT EXISTS %s (...);" as SQLite keeps it once run.
+std::string StoredCreateSql(const std::string& format, const std::string& table);
+
+// The weather tables as a database of the given schema version has them:
+// the columns that later versions added are left out.
+std::string OldWeatherTableSql(const std::string& table, double version);
+extern const std::pair<const char*, const char*> WEATHER_TABLE_FORMATS[6];
 
 bool FileExists(const std::string& path);
 std::string ReadFileBytes(const std::string& path);

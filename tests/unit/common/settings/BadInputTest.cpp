@@ -1,0 +1,112 @@
+#include <random>
+
+#include "ContentProvider.h"
+#include "DataStoreInitializer.h"
+#include "IconMappingTable.h"
+#include "SettingDBController.h"
+#include "SettingsTestSupport.h"
+#include "ShareTargetDBController.h"
+#include "VersionDBController.h"
+#include "WeatherDefine.h"
+
+using namespace NSWeather;
+using SettingsTest::RawDB;
+
+namespace
+{
+
+std::string RandomBytes(size_t size, unsigned seed)
+{
+    std::mt19937 generator(seed);
+    std::string bytes(size, '\0');
+    for (char& byte : bytes)
+        byte = static_cast<char>(generator() & 0xff);
+    return bytes;
+}
+
+class BadInputTest : public SettingsTest::SettingsFixture
+{
+protected:
+    // Every reader of the settings gives its empty value.
+    void ExpectEmptyReadings()
+    {
+        EXPECT_FALSE(SettingDBController().Select());
+        EXPECT_EQ(CP_ACCUWEATHER, ContentProvider::GetContentProvider());
+        EXPECT_EQ("weather_logo_accuweather.png", ContentProvider::GetCPLogoIconPath(1));
+        for (int iconNum : {1, 16, 33})
+            EXPECT_EQ(0, IconMappingTable().GetMappingIconNum(iconNum, true)) << iconNum;
+    }
+};
+
+TEST_F(BadInputTest, SettingsFileOfRandomBytesIsReadAsAbsentAndKept)
+{
+    MakeDBDir();
+    for (unsigned seed : {1u, 2u, 3u})
+    {
+        std::string garbage = RandomBytes(4096, seed);
+        SettingsTest::WriteFileBytes(SettingDBPath(), garbage);
+
+        ExpectEmptyReadings();
+        EXPECT_EQ(ERR_FAIL, SettingDBController().Initialize());
+        SettingDBController().Update(std::make_shared<Setting>());
+        SettingDBController().UpdateLocationIdOfDisplayCity("x");
+        EXPECT_EQ(ERR_FAIL, DataStoreInitializer::Run());
+        EXPECT_EQ(garbage, SettingsTest::ReadFileBytes(SettingDBPath())) << "seed " << seed;
+    }
+}
+
+TEST_F(BadInputTest, SettingTableOfAForeignSchemaIsReadAsAbsent)
+{
+    MakeDBDir();
+    {
+        RawDB db(SettingDBPath());
+        db.Exec("CREATE TABLE SETTING_TABLE (name TEXT, value TEXT);"
+                "INSERT INTO SETTING_TABLE VALUES ('CpType', 'WeatherNews');");
+    }
+    ExpectEmptyReadings();
+    EXPECT_EQ(ERR_OK, SettingDBController().Initialize());
+    SettingDBController().Update(std::make_shared<Setting>());
+    ExpectEmptyReadings();
+    RawDB db(SettingDBPath(), true);
+    EXPECT_EQ("CpType=WeatherNews", db.QueryText("SELECT group_concat(name || '=' || value) FROM SETTING_TABLE"));
+}
+
+TEST_F(BadInputTest, EmptyForeignSettingTableTakesNoRowAndSaysSo)
+{
+    MakeDBDir();
+    RawDB(SettingDBPath()).Exec("CREATE TABLE SETTING_TABLE (name TEXT, value TEXT);");
+    EXPECT_EQ(ERR_FAIL, SettingDBController().Initialize());
+    ExpectEmptyReadings();
+}
+
+TEST_F(BadInputTest, SettingsWithTextWhereNumbersBelongReadAsZero)
+{
+    InitializeSettings();
+    SetSettingColumn("TemperatureUnit", "'celsius'");
+    SetSettingColumn("AutoRefreshOn", "NULL");
+    SetSettingColumn("CpType", "NULL");
+    SettingPtr read = SettingDBController().Select();
+    ASSERT_TRUE(read);
+    EXPECT_EQ(0, read->GetTemperatureUnit());
+    EXPECT_FALSE(read->GetAutoRefreshOn());
+    EXPECT_EQ("", read->GetCpType());
+    EXPECT_EQ(CP_ACCUWEATHER, ContentProvider::GetContentProvider());
+}
+
+TEST_F(BadInputTest, OtherDatabasesOfRandomBytesDoNotStopTheStart)
+{
+    MakeDBDir();
+    std::string garbage = RandomBytes(2048, 7);
+    SettingsTest::WriteFileBytes(ShareTargetDBPath(), garbage);
+    SettingsTest::WriteFileBytes(VersionDBPath(), garbage);
+
+    DataStoreInitializer::Run();
+    EXPECT_EQ(garbage, SettingsTest::ReadFileBytes(ShareTargetDBPath()));
+    EXPECT_EQ(garbage, SettingsTest::ReadFileBytes(VersionDBPath()));
+    EXPECT_FALSE(ShareTargetDBController().Select());
+    EXPECT_DOUBLE_EQ(0.0, VersionDBController().GetCurrentDBVersion());
+    // The settings are still usable.
+    EXPECT_EQ("Accuweather", SettingDBController().Select()->GetCpType());
+}
+
+}  // namespace
