@@ -117,6 +117,18 @@ void Draw(Drawn& drawn, int w, int h)
     evas_object_move(text, 20, h / 2);
     evas_object_pass_events_set(text, EINA_TRUE);
     evas_object_show(text);
+    // A layout with an image in one of its swallows, for the dump.
+    Evas_Object* layout = elm_layout_add(drawn.window);
+    elm_layout_file_set(layout, TEST_WIDGET_EDJ, "test/page");
+    elm_object_part_text_set(layout, "title", drawn.id.c_str());
+    elm_object_part_text_set(layout, "note", "second line");
+    Evas_Object* icon = elm_image_add(layout);
+    elm_image_file_set(icon, TEST_WIDGET_EDJ, "test/icon");
+    elm_object_part_content_set(layout, "icon", icon);
+    evas_object_move(layout, w / 2, 0);
+    evas_object_resize(layout, w / 2, h / 2);
+    evas_object_pass_events_set(layout, EINA_TRUE);
+    evas_object_show(layout);
 }
 
 int CreateCb(widget_context_h context, bundle* content, int w, int h, void*)

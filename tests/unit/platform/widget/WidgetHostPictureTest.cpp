@@ -77,6 +77,12 @@ TEST_F(WidgetHostTest, DumpDescribesTheTextsOfTheWindow)
     EXPECT_EQ(reply.find('\n'), std::string::npos);
     EXPECT_THAT(reply, HasSubstr("\"text\":\"" + id + "\""));
     EXPECT_THAT(reply, HasSubstr("\"type\":\"text\""));
+    // The layout: its group, both text parts, the image in one swallow and the empty one.
+    EXPECT_THAT(reply, HasSubstr("\"group\":\"test/page\",\"texts\":{\"title\":\"" + id +
+                                 "\",\"note\":\"second line\"},\"swallows\":{\"icon\":{"));
+    EXPECT_THAT(reply, HasSubstr("TestWidgetLayout.edj\",\"group\":\"test/icon\""));
+    EXPECT_THAT(reply, HasSubstr("\"empty\":null"));
+    EXPECT_THAT(Send("dump"), HasSubstr("ERR usage"));
 }
 
 }  // namespace WeatherTest
