@@ -4,6 +4,8 @@
 #include <functional>
 #include <memory>
 #include <string>
+#include <utility>
+#include <vector>
 
 #include "City.h"
 #include "QueryGenernator.h"
@@ -50,6 +52,8 @@ public:
     void Reorder(CityPtrVectorPtr reorderPtrVector);
     CityPtr Select(int primaryKey);
     CityPtr Select(const std::string& locationId);
+    // Every row as (PK_ID, city without children), in PK_ID order.
+    std::vector<std::pair<int, CityPtr>> SelectAll();
 
 private:
     using Binder = std::function<void(DBStatement&)>;

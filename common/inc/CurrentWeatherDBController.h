@@ -1,6 +1,7 @@
 #ifndef NSWEATHER_CURRENT_WEATHER_DB_CONTROLLER_H
 #define NSWEATHER_CURRENT_WEATHER_DB_CONTROLLER_H
 
+#include <map>
 #include <memory>
 
 #include "Current.h"
@@ -26,6 +27,9 @@ public:
     void Update(int foreignKey, CurrentPtr currentPtr);
     // Null when the city has no row.
     CurrentPtr Select(int foreignKey);
+    // Every city's row by FK_ID in one pass (the first row of a key wins,
+    // as in Select).
+    std::map<int, CurrentPtr> SelectAll();
 
 private:
     QueryGenernator mQueryGenernator;

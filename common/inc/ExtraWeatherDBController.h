@@ -1,6 +1,7 @@
 #ifndef NSWEATHER_EXTRA_WEATHER_DB_CONTROLLER_H
 #define NSWEATHER_EXTRA_WEATHER_DB_CONTROLLER_H
 
+#include <map>
 #include <memory>
 
 #include "Extra.h"
@@ -26,6 +27,8 @@ public:
     void Update(int foreignKey, ExtraPtr extraPtr);
     // Null when the city has no row.
     ExtraPtr Select(int foreignKey);
+    // Every city's row by FK_ID in one pass (the first row of a key wins).
+    std::map<int, ExtraPtr> SelectAll();
 
 private:
     QueryGenernator mQueryGenernator;

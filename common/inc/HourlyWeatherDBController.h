@@ -1,6 +1,7 @@
 #ifndef NSWEATHER_HOURLY_WEATHER_DB_CONTROLLER_H
 #define NSWEATHER_HOURLY_WEATHER_DB_CONTROLLER_H
 
+#include <map>
 #include <memory>
 
 #include "Hourly.h"
@@ -28,6 +29,9 @@ public:
     void Update(int foreignKey, HourlyPtrVectorPtr hourlyPtrVector);
     // Never null; empty when the city has no rows.
     HourlyPtrVectorPtr Select(int foreignKey);
+    // Every city's rows by FK_ID in one pass, each list in the order Select
+    // gives it.
+    std::map<int, HourlyPtrVectorPtr> SelectAll();
 
 private:
     QueryGenernator mQueryGenernator;

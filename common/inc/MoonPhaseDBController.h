@@ -1,6 +1,7 @@
 #ifndef NSWEATHER_MOON_PHASE_DB_CONTROLLER_H
 #define NSWEATHER_MOON_PHASE_DB_CONTROLLER_H
 
+#include <map>
 #include <memory>
 #include <string>
 #include <vector>
@@ -30,6 +31,9 @@ public:
     void Update(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector);
     // Never null; empty when the city has no rows.
     MoonPhasePtrVectorPtr Select(int foreignKey);
+    // Every city's rows by FK_ID in one pass, each list in the order Select
+    // gives it.
+    std::map<int, MoonPhasePtrVectorPtr> SelectAll();
     // The location id of every stored series (its first row).
     std::vector<std::string> SelectAllLocationId();
 

@@ -1,6 +1,7 @@
 #ifndef NSWEATHER_WEEKLY_WEATHER_DB_CONTROLLER_H
 #define NSWEATHER_WEEKLY_WEATHER_DB_CONTROLLER_H
 
+#include <map>
 #include <memory>
 
 #include "Weekly.h"
@@ -28,6 +29,9 @@ public:
     void Update(int foreignKey, WeeklyPtrVectorPtr weeklyPtrVector);
     // Never null; empty when the city has no rows.
     WeeklyPtrVectorPtr Select(int foreignKey);
+    // Every city's rows by FK_ID in one pass, each list in the order Select
+    // gives it.
+    std::map<int, WeeklyPtrVectorPtr> SelectAll();
 
 private:
     QueryGenernator mQueryGenernator;

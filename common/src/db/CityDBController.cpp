@@ -332,6 +332,16 @@ void CityDBController::Reorder(CityPtrVectorPtr reorderPtrVector)
     }
 }
 
+std::vector<std::pair<int, CityPtr>> CityDBController::SelectAll()
+{
+    std::vector<std::pair<int, CityPtr>> rows;
+    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(INSERT_COLUMNS) + ",PK_ID",
+                                                      mQueryGenernator.MakeOrderByClause("PK_ID", true)));
+    while (stmt.Step() == SQLITE_ROW)
+        rows.emplace_back(stmt.ColumnInt(15), ReadCity(stmt));
+    return rows;
+}
+
 CityPtr CityDBController::Select(int primaryKey)
 {
     return SelectCity("PK_ID = ?", BindIntAt1(primaryKey));

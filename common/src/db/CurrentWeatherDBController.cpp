@@ -38,6 +38,19 @@ int BindValues(DBStatement& stmt, int i, const CurrentPtr& currentPtr)
     stmt.BindText(i++, currentPtr->GetWebsiteUrl());
     return i;
 }
+
+CurrentPtr ReadCurrent(const DBStatement& stmt)
+{
+    CurrentPtr currentPtr = std::make_shared<Current>();
+    currentPtr->SetWeatherIcon(stmt.ColumnInt(0));
+    currentPtr->SetWeatherStatus(stmt.ColumnText(1));
+    currentPtr->SetCurTemperature(stmt.ColumnTemperature(2));
+    currentPtr->SetLowTemperature(stmt.ColumnTemperature(3));
+    currentPtr->SetHighTemperature(stmt.ColumnTemperature(4));
+    currentPtr->SetDate(static_cast<time_t>(stmt.ColumnInt64(5)));
+    currentPtr->SetWebsiteUrl(stmt.ColumnText(6));
+    return currentPtr;
+}
 }  // namespace
 
 CurrentWeatherDBController::CurrentWeatherDBController()
@@ -98,15 +111,16 @@ CurrentPtr CurrentWeatherDBController::Select(int foreignKey)
         COMMON_LOG("No result : %d", rc);
         return nullptr;
     }
-    CurrentPtr currentPtr = std::make_shared<Current>();
-    currentPtr->SetWeatherIcon(stmt.ColumnInt(0));
-    currentPtr->SetWeatherStatus(stmt.ColumnText(1));
-    currentPtr->SetCurTemperature(stmt.ColumnTemperature(2));
-    currentPtr->SetLowTemperature(stmt.ColumnTemperature(3));
-    currentPtr->SetHighTemperature(stmt.ColumnTemperature(4));
-    currentPtr->SetDate(static_cast<time_t>(stmt.ColumnInt64(5)));
-    currentPtr->SetWebsiteUrl(stmt.ColumnText(6));
-    return currentPtr;
+    return ReadCurrent(stmt);
+}
+
+std::map<int, CurrentPtr> CurrentWeatherDBController::SelectAll()
+{
+    std::map<int, CurrentPtr> currentPtrMap;
+    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"));
+    while (stmt.Step() == SQLITE_ROW)
+        currentPtrMap.emplace(stmt.ColumnInt(7), ReadCurrent(stmt));
+    return currentPtrMap;
 }
 
 }  // namespace NSWeather

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 #include <ctime>
+#include <map>
+#include <utility>
 
 #include "CityDBController.h"
 #include "CommonLog.h"
@@ -23,6 +25,13 @@ namespace
 std::string GetWeatherDBFilePath()
 {
     return FileUtil::GetWeatherDBFilePath();
+}
+
+template <typename T>
+T FindOr(const std::map<int, T>& values, int key, T fallback)
+{
+    auto found = values.find(key);
+    return found != values.end() ? found->second : fallback;
 }
 
 // Commits and closes the cycle when the operation leaves, on every path.
@@ -82,17 +91,40 @@ CityPtr DBController::SelectDataWithPrimaryKey(CityDBController& cityDBControlle
     return cityPtr;
 }
 
+// Same result as selecting page 0, 1, ... one city at a time, but with one
+// statement per table: the child tables have no index on FK_ID, so a
+// per-city select scans them all for every city.
 CityPtrVectorPtr DBController::SelectAllCities(CityDBController& cityDBController)
 {
     CityPtrVectorPtr cityPtrVector = std::make_shared<CityPtrVector>();
     int count = cityDBController.GetNumberOfCities();
+    if (count <= 0)
+        return cityPtrVector;
+    std::map<int, std::pair<int, CityPtr>> rowByPage;
+    for (const auto& row : cityDBController.SelectAll())
+        rowByPage.emplace(row.second->GetPageIndex(), row);  // the lowest key of a page wins
+    std::map<int, CurrentPtr> currentMap = CurrentWeatherDBController().SelectAll();
+    std::map<int, WeeklyPtrVectorPtr> weeklyMap = WeeklyWeatherDBController().SelectAll();
+    std::map<int, HourlyPtrVectorPtr> hourlyMap = HourlyWeatherDBController().SelectAll();
+    std::map<int, ExtraPtr> extraMap = ExtraWeatherDBController().SelectAll();
+    std::map<int, MoonPhasePtrVectorPtr> moonPhaseMap = MoonPhaseDBController().SelectAll();
     for (int pageIndex = 0; pageIndex < count; ++pageIndex)
     {
-        int primaryKey = cityDBController.GetPrimaryKey(pageIndex);
-        CityPtr cityPtr = SelectDataWithPrimaryKey(cityDBController, primaryKey);
-        // A gap in the page indexes (another writer mid-change) is skipped.
-        if (cityPtr)
-            cityPtrVector->push_back(cityPtr);
+        auto row = rowByPage.find(pageIndex);
+        if (row == rowByPage.end())
+        {
+            // A gap in the page indexes (another writer mid-change) is skipped.
+            COMMON_LOG("!cityPtr");
+            continue;
+        }
+        int primaryKey = row->second.first;
+        CityPtr cityPtr = row->second.second;
+        cityPtr->SetCurrentPtr(FindOr(currentMap, primaryKey, CurrentPtr()));
+        cityPtr->SetWeeklyPtrVector(FindOr(weeklyMap, primaryKey, std::make_shared<WeeklyPtrVector>()));
+        cityPtr->SetHourlyPtrVector(FindOr(hourlyMap, primaryKey, std::make_shared<HourlyPtrVector>()));
+        cityPtr->SetExtraPtr(FindOr(extraMap, primaryKey, ExtraPtr()));
+        cityPtr->SetMoonPhasePtrVector(FindOr(moonPhaseMap, primaryKey, std::make_shared<MoonPhasePtrVector>()));
+        cityPtrVector->push_back(cityPtr);
     }
     return cityPtrVector;
 }
@@ -198,11 +230,15 @@ bool DBController::IsCurrentLocationExist()
 
 bool DBController::InsertIfNew(CityDBController& cityDBController, CityPtr cityPtr)
 {
-    CityPtrVectorPtr storedPtrVector = SelectAllCities(cityDBController);
-    for (const CityPtr& storedPtr : *storedPtrVector)
+    // Compared as it will be stored, so a current-location city is found
+    // again once its id carries ":C".
+    std::string locationId = cityPtr->GetLocationId();
+    if (cityPtr->GetIsCurrentLocation() && locationId.find(":C") == std::string::npos)
+        locationId += ":C";
+    for (const auto& row : cityDBController.SelectAll())
     {
-        if (storedPtr->GetLocationId() == cityPtr->GetLocationId() &&
-            storedPtr->GetIsCurrentLocation() == cityPtr->GetIsCurrentLocation())
+        if (row.second->GetLocationId() == locationId &&
+            row.second->GetIsCurrentLocation() == cityPtr->GetIsCurrentLocation())
         {
             COMMON_LOG("There is a same city in DB");
             return false;

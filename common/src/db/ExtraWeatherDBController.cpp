@@ -164,4 +164,13 @@ ExtraPtr ExtraWeatherDBController::Select(int foreignKey)
     return ReadExtra(stmt);
 }
 
+std::map<int, ExtraPtr> ExtraWeatherDBController::SelectAll()
+{
+    std::map<int, ExtraPtr> extraPtrMap;
+    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"));
+    while (stmt.Step() == SQLITE_ROW)
+        extraPtrMap.emplace(stmt.ColumnInt(28), ReadExtra(stmt));
+    return extraPtrMap;
+}
+
 }  // namespace NSWeather

@@ -39,6 +39,19 @@ int BindValues(DBStatement& stmt, int i, const HourlyPtr& hourlyPtr)
     stmt.BindText(i++, hourlyPtr->GetWebsiteUrl());
     return i;
 }
+
+HourlyPtr ReadHourly(const DBStatement& stmt)
+{
+    HourlyPtr hourlyPtr = std::make_shared<Hourly>();
+    hourlyPtr->SetHour(static_cast<time_t>(stmt.ColumnInt64(0)));
+    hourlyPtr->SetWeatherIcon(stmt.ColumnInt(1));
+    hourlyPtr->SetWeatherStatus(stmt.ColumnText(2));
+    hourlyPtr->SetCurTemperature(stmt.ColumnTemperature(3));
+    hourlyPtr->SetLowTemperature(stmt.ColumnTemperature(4));
+    hourlyPtr->SetHighTemperature(stmt.ColumnTemperature(5));
+    hourlyPtr->SetWebsiteUrl(stmt.ColumnText(6));
+    return hourlyPtr;
+}
 }  // namespace
 
 HourlyWeatherDBController::HourlyWeatherDBController()
@@ -112,18 +125,22 @@ HourlyPtrVectorPtr HourlyWeatherDBController::Select(int foreignKey)
                                                       mQueryGenernator.MakeWhereClause("FK_ID = ?")));
     stmt.BindInt(1, foreignKey);
     while (stmt.Step() == SQLITE_ROW)
-    {
-        HourlyPtr hourlyPtr = std::make_shared<Hourly>();
-        hourlyPtr->SetHour(static_cast<time_t>(stmt.ColumnInt64(0)));
-        hourlyPtr->SetWeatherIcon(stmt.ColumnInt(1));
-        hourlyPtr->SetWeatherStatus(stmt.ColumnText(2));
-        hourlyPtr->SetCurTemperature(stmt.ColumnTemperature(3));
-        hourlyPtr->SetLowTemperature(stmt.ColumnTemperature(4));
-        hourlyPtr->SetHighTemperature(stmt.ColumnTemperature(5));
-        hourlyPtr->SetWebsiteUrl(stmt.ColumnText(6));
-        hourlyPtrVector->push_back(hourlyPtr);
-    }
+        hourlyPtrVector->push_back(ReadHourly(stmt));
     return hourlyPtrVector;
+}
+
+std::map<int, HourlyPtrVectorPtr> HourlyWeatherDBController::SelectAll()
+{
+    std::map<int, HourlyPtrVectorPtr> listMap;
+    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"));
+    while (stmt.Step() == SQLITE_ROW)
+    {
+        HourlyPtrVectorPtr& list = listMap[stmt.ColumnInt(7)];
+        if (!list)
+            list = std::make_shared<HourlyPtrVector>();
+        list->push_back(ReadHourly(stmt));
+    }
+    return listMap;
 }
 
 }  // namespace NSWeather

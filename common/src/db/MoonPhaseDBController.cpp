@@ -33,6 +33,18 @@ int BindValues(DBStatement& stmt, int i, const MoonPhasePtr& moonPhasePtr)
     stmt.BindInt(i++, moonPhasePtr->GetAge());
     return i;
 }
+
+MoonPhasePtr ReadMoonPhase(const DBStatement& stmt)
+{
+    MoonPhasePtr moonPhasePtr = std::make_shared<MoonPhase>();
+    moonPhasePtr->SetLocationID(stmt.ColumnText(0));
+    moonPhasePtr->SetDate(static_cast<time_t>(stmt.ColumnInt64(1)));
+    moonPhasePtr->SetMoonRiseTime(static_cast<time_t>(stmt.ColumnInt64(2)));
+    moonPhasePtr->SetMoonSetTime(static_cast<time_t>(stmt.ColumnInt64(3)));
+    moonPhasePtr->SetPhaseText(stmt.ColumnText(4));
+    moonPhasePtr->SetAge(stmt.ColumnInt(5));
+    return moonPhasePtr;
+}
 }  // namespace
 
 MoonPhaseDBController::MoonPhaseDBController()
@@ -113,16 +125,7 @@ MoonPhasePtrVectorPtr MoonPhaseDBController::Select(int foreignKey)
                                                       mQueryGenernator.MakeWhereClause("FK_ID = ?")));
     stmt.BindInt(1, foreignKey);
     while (stmt.Step() == SQLITE_ROW)
-    {
-        MoonPhasePtr moonPhasePtr = std::make_shared<MoonPhase>();
-        moonPhasePtr->SetLocationID(stmt.ColumnText(0));
-        moonPhasePtr->SetDate(static_cast<time_t>(stmt.ColumnInt64(1)));
-        moonPhasePtr->SetMoonRiseTime(static_cast<time_t>(stmt.ColumnInt64(2)));
-        moonPhasePtr->SetMoonSetTime(static_cast<time_t>(stmt.ColumnInt64(3)));
-        moonPhasePtr->SetPhaseText(stmt.ColumnText(4));
-        moonPhasePtr->SetAge(stmt.ColumnInt(5));
-        moonPhasePtrVector->push_back(moonPhasePtr);
-    }
+        moonPhasePtrVector->push_back(ReadMoonPhase(stmt));
     return moonPhasePtrVector;
 }
 
@@ -136,6 +139,20 @@ std::vector<std::string> MoonPhaseDBController::SelectAllLocationId()
     if (retStringVector.size() < 1)
         COMMON_LOG("retStringVector.size() < 1");
     return retStringVector;
+}
+
+std::map<int, MoonPhasePtrVectorPtr> MoonPhaseDBController::SelectAll()
+{
+    std::map<int, MoonPhasePtrVectorPtr> listMap;
+    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"));
+    while (stmt.Step() == SQLITE_ROW)
+    {
+        MoonPhasePtrVectorPtr& list = listMap[stmt.ColumnInt(6)];
+        if (!list)
+            list = std::make_shared<MoonPhasePtrVector>();
+        list->push_back(ReadMoonPhase(stmt));
+    }
+    return listMap;
 }
 
 }  // namespace NSWeather

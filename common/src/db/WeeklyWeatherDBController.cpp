@@ -48,6 +48,20 @@ int DayOfWeek(time_t date)
         return 0;
     return local.tm_wday;
 }
+
+WeeklyPtr ReadWeekly(const DBStatement& stmt)
+{
+    WeeklyPtr weeklyPtr = std::make_shared<Weekly>();
+    weeklyPtr->SetWeatherIcon(stmt.ColumnInt(0));
+    weeklyPtr->SetWeatherStatus(stmt.ColumnText(1));
+    weeklyPtr->SetCurTemperature(stmt.ColumnTemperature(2));
+    weeklyPtr->SetLowTemperature(stmt.ColumnTemperature(3));
+    weeklyPtr->SetHighTemperature(stmt.ColumnTemperature(4));
+    weeklyPtr->SetDate(static_cast<time_t>(stmt.ColumnInt64(5)));
+    weeklyPtr->SetWebsiteUrl(stmt.ColumnText(6));
+    weeklyPtr->SetDayOfWeek(DayOfWeek(weeklyPtr->GetDate()));
+    return weeklyPtr;
+}
 }  // namespace
 
 WeeklyWeatherDBController::WeeklyWeatherDBController()
@@ -120,19 +134,22 @@ WeeklyPtrVectorPtr WeeklyWeatherDBController::Select(int foreignKey)
                                                       mQueryGenernator.MakeWhereClause("FK_ID = ?")));
     stmt.BindInt(1, foreignKey);
     while (stmt.Step() == SQLITE_ROW)
-    {
-        WeeklyPtr weeklyPtr = std::make_shared<Weekly>();
-        weeklyPtr->SetWeatherIcon(stmt.ColumnInt(0));
-        weeklyPtr->SetWeatherStatus(stmt.ColumnText(1));
-        weeklyPtr->SetCurTemperature(stmt.ColumnTemperature(2));
-        weeklyPtr->SetLowTemperature(stmt.ColumnTemperature(3));
-        weeklyPtr->SetHighTemperature(stmt.ColumnTemperature(4));
-        weeklyPtr->SetDate(static_cast<time_t>(stmt.ColumnInt64(5)));
-        weeklyPtr->SetWebsiteUrl(stmt.ColumnText(6));
-        weeklyPtr->SetDayOfWeek(DayOfWeek(weeklyPtr->GetDate()));
-        weeklyPtrVector->push_back(weeklyPtr);
-    }
+        weeklyPtrVector->push_back(ReadWeekly(stmt));
     return weeklyPtrVector;
+}
+
+std::map<int, WeeklyPtrVectorPtr> WeeklyWeatherDBController::SelectAll()
+{
+    std::map<int, WeeklyPtrVectorPtr> listMap;
+    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"));
+    while (stmt.Step() == SQLITE_ROW)
+    {
+        WeeklyPtrVectorPtr& list = listMap[stmt.ColumnInt(7)];
+        if (!list)
+            list = std::make_shared<WeeklyPtrVector>();
+        list->push_back(ReadWeekly(stmt));
+    }
+    return listMap;
 }
 
 }  // namespace NSWeather

@@ -278,6 +278,9 @@ TEST_F(DBControllerTest, SameCityIsStoredOnce)
     // The current-location twin of a city is another city (its id gets ":C").
     EXPECT_EQ(mDB.InsertCityData(MakeCity("A", 9, true)), ERR_OK);
     EXPECT_EQ(mDB.GetNumberOfCities(), 2);
+    // ... and is found again although the stored id carries the suffix.
+    EXPECT_EQ(mDB.InsertCityData(MakeCity("A", 10, true)), ERR_FAIL);
+    EXPECT_EQ(mDB.GetNumberOfCities(), 2);
 }
 
 TEST_F(DBControllerTest, ReferenceCountNeverDropsBelowZero)
@@ -376,4 +379,39 @@ TEST_F(DBControllerTest, RefreshTimeAheadOfTheClockCountsAsExpired)
     future->SetRefreshedTime(time(nullptr) + 24 * 3600);
     mDB.InsertCityData(future);
     EXPECT_TRUE(mDB.GetIsWeatherInfoExpired());
+}
+
+TEST_F(DBControllerTest, ListAgreesWithSingleSelects)
+{
+    InsertCities({"A", "B", "C"});
+    CityPtr b = MakeCity("B", 1);
+    b->SetPageIndex(1);
+    b->GetMoonPhasePtrVector()->resize(1);
+    mDB.UpdateOnlyMoonPhaseData(b);
+    RawDB(WeatherDBPath()).Exec("DELETE FROM CURRENT_WEATHER_TABLE WHERE FK_ID = 3;");
+    CityPtrVectorPtr all = mDB.SelectAllCityData();
+    ASSERT_EQ(all->size(), 3u);
+    for (int page = 0; page < 3; ++page)
+    {
+        CityPtr one = mDB.SelectCityData(page);
+        CityPtr listed = all->at(page);
+        EXPECT_EQ(listed->GetLocationId(), one->GetLocationId());
+        EXPECT_EQ(listed->GetPageIndex(), page);
+        EXPECT_EQ(static_cast<bool>(listed->GetCurrentPtr()), static_cast<bool>(one->GetCurrentPtr())) << page;
+        EXPECT_EQ(listed->GetHourlyPtrVector()->size(), one->GetHourlyPtrVector()->size());
+        EXPECT_EQ(listed->GetWeeklyPtrVector()->size(), one->GetWeeklyPtrVector()->size());
+        EXPECT_EQ(listed->GetMoonPhasePtrVector()->size(), one->GetMoonPhasePtrVector()->size());
+        EXPECT_EQ(listed->GetHourlyPtrVector()->at(5)->GetWeatherStatus(), "hour 5");
+    }
+    EXPECT_FALSE(all->at(2)->GetCurrentPtr());
+    EXPECT_EQ(all->at(1)->GetMoonPhasePtrVector()->size(), 1u);
+    EXPECT_TRUE(all->at(0)->GetMoonPhasePtrVector()->empty());
+}
+
+// Rows written by another program with a duplicate and a missing page index.
+TEST_F(DBControllerTest, ListSkipsMissingPagesAndTakesTheFirstOfADuplicate)
+{
+    InsertCities({"A", "B", "C"});
+    RawDB(WeatherDBPath()).Exec("UPDATE CITY_TABLE SET pageIndex = 0 WHERE locationId = 'B';");
+    EXPECT_EQ(PageOrder(), (std::vector<std::string>{"A@0", "C@2"}));
 }
