@@ -81,8 +81,9 @@ Evas_Object* WidgetInstance::GetParentObject()
 {
     if (mParentObject)
         return mParentObject;
+    // The rectangle only carries the canvas to the window; it is never drawn.
     if (!mParentCanvas)
-        mParentCanvas = ecore_evas_buffer_new(mWidth, mHeight);
+        mParentCanvas = ecore_evas_buffer_new(1, 1);
     if (!mParentCanvas)
     {
         dlog_print(DLOG_ERROR, kLogTag, "no off-screen canvas for %s", mId.c_str());
