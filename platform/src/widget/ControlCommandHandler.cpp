@@ -197,8 +197,7 @@ std::string ControlCommandHandler::Tap(const Words& words)
     WidgetInstance* instance = FindDrawn(words, error);
     if (!instance)
         return error;
-    unsigned start = InputFeeder::NextTimestamp();
-    InputFeeder::Tap(instance->GetWindowCanvas(), x, y, static_cast<unsigned>(ms));
+    unsigned start = InputFeeder::Tap(instance->GetWindowCanvas(), x, y, static_cast<unsigned>(ms));
     return "OK " + std::to_string(start);
 }
 
@@ -214,8 +213,7 @@ std::string ControlCommandHandler::Swipe(const Words& words)
     WidgetInstance* instance = FindDrawn(words, error);
     if (!instance)
         return error;
-    unsigned start = InputFeeder::NextTimestamp();
-    InputFeeder::Swipe(instance->GetWindowCanvas(), values[0], values[1], values[2], values[3],
+    unsigned start = InputFeeder::Swipe(instance->GetWindowCanvas(), values[0], values[1], values[2], values[3],
                        static_cast<unsigned>(values[4]));
     return "OK " + std::to_string(start);
 }

@@ -36,7 +36,8 @@ void IdleWatcher::Wait(double timeoutSeconds, DoneCb done)
 {
     auto waiter = std::make_unique<Waiter>();
     waiter->watcher = this;
-    waiter->deadline = ecore_time_get() + timeoutSeconds;
+    waiter->start = ecore_time_get();
+    waiter->deadline = waiter->start + timeoutSeconds;
     waiter->done = std::move(done);
     waiter->timer = ecore_timer_add(kTickSeconds, TickCb, waiter.get());
     mWaiters.push_back(std::move(waiter));
@@ -95,7 +96,7 @@ Eina_Bool IdleWatcher::IdlerCb(void* data)
 void IdleWatcher::Check(Waiter* waiter)
 {
     HookCanvases();
-    std::string pending = DescribePending();
+    std::string pending = DescribePending(waiter->start);
     waiter->quietChecks = pending.empty() ? waiter->quietChecks + 1 : 0;
     if (waiter->quietChecks >= kQuietChecksNeeded)
         Finish(waiter, std::string());
@@ -103,13 +104,14 @@ void IdleWatcher::Check(Waiter* waiter)
         Finish(waiter, pending.empty() ? "not settled" : pending);
 }
 
-std::string IdleWatcher::DescribePending()
+std::string IdleWatcher::DescribePending(double watchStart)
 {
     std::string pending;
     int timers = CountForeignTimers();
     if (timers > 0)
         pending += std::to_string(timers) + " timer(s)";
-    if (ecore_time_get() - mLastChange < kStillTime)
+    // Draws before the watch began were not seen, so stillness counts from then.
+    if (ecore_time_get() - std::max(mLastChange, watchStart) < kStillTime)
         pending += std::string(pending.empty() ? "" : ", ") + "canvas still drawing";
     return pending;
 }

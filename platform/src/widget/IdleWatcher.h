@@ -40,6 +40,7 @@ private:
     struct Waiter
     {
         IdleWatcher* watcher;
+        double start;
         double deadline;
         DoneCb done;
         Ecore_Timer* timer = nullptr;
@@ -52,7 +53,7 @@ private:
     static void RenderPostCb(void* data, Evas* canvas, void* eventInfo);
     void HookCanvases();
     void Check(Waiter* waiter);
-    std::string DescribePending();
+    std::string DescribePending(double watchStart);
     int CountForeignTimers();
     void Finish(Waiter* waiter, const std::string& pending);
 

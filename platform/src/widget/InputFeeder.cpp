@@ -29,15 +29,16 @@ void InputFeeder::Begin(Evas* canvas, int x, int y, unsigned timestamp)
     evas_event_feed_mouse_down(canvas, 1, EVAS_BUTTON_NONE, timestamp, nullptr);
 }
 
-void InputFeeder::Tap(Evas* canvas, int x, int y, unsigned durationMs)
+unsigned InputFeeder::Tap(Evas* canvas, int x, int y, unsigned durationMs)
 {
     unsigned start = NextTimestamp();
     Begin(canvas, x, y, start);
     evas_event_feed_mouse_up(canvas, 1, EVAS_BUTTON_NONE, start + durationMs, nullptr);
     sLastTimestamp = start + durationMs;
+    return start;
 }
 
-void InputFeeder::Swipe(Evas* canvas, int x1, int y1, int x2, int y2, unsigned durationMs)
+unsigned InputFeeder::Swipe(Evas* canvas, int x1, int y1, int x2, int y2, unsigned durationMs)
 {
     unsigned start = NextTimestamp();
     Begin(canvas, x1, y1, start);
@@ -50,6 +51,7 @@ void InputFeeder::Swipe(Evas* canvas, int x1, int y1, int x2, int y2, unsigned d
     }
     evas_event_feed_mouse_up(canvas, 1, EVAS_BUTTON_NONE, start + durationMs, nullptr);
     sLastTimestamp = start + durationMs;
+    return start;
 }
 
 }  // namespace platform

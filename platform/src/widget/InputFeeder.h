@@ -12,14 +12,13 @@ class InputFeeder
 {
 public:
     // Down at (x, y), up `durationMs` later at the same place.
-    static void Tap(Evas* canvas, int x, int y, unsigned durationMs);
+    // Each returns the timestamp of its mouse down.
+    static unsigned Tap(Evas* canvas, int x, int y, unsigned durationMs);
     // Down at the start, moves about every 16 ms along the line, up at the
     // end `durationMs` after the down.
-    static void Swipe(Evas* canvas, int x1, int y1, int x2, int y2, unsigned durationMs);
-    // The timestamp the next gesture starts at.
-    static unsigned NextTimestamp();
-
+    static unsigned Swipe(Evas* canvas, int x1, int y1, int x2, int y2, unsigned durationMs);
 private:
+    static unsigned NextTimestamp();
     static void Begin(Evas* canvas, int x, int y, unsigned timestamp);
     static unsigned sLastTimestamp;
 };

@@ -81,7 +81,7 @@ void MouseUpCb(void* data, Evas*, Evas_Object*, void* info)
     Elm_Transit* transit = elm_transit_add();
     elm_transit_object_add(transit, drawn->block);
     elm_transit_effect_translation_add(transit, 0, 0, 40, 0);
-    elm_transit_duration_set(transit, 0.3);
+    elm_transit_duration_set(transit, 1.0);
     elm_transit_del_cb_set(transit, TransitEndCb, nullptr);
     elm_transit_go(transit);
     Record("trigger %d", widget_service_trigger_update(kWidgetId, drawn->id.c_str(), nullptr, 0));
