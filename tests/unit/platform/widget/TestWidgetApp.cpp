@@ -12,6 +12,7 @@
 #include "elm_win_tizen.h"
 #include "widget.h"
 #include "widget_app.h"
+#include "widget_app_efl.h"
 #include "widget_service.h"
 
 namespace
@@ -137,13 +138,19 @@ int CreateCb(widget_context_h context, bundle* content, int w, int h, void*)
     widget_size_type_e type = WIDGET_SIZE_TYPE_UNKNOWN;
     widget_service_get_size_type(w, h, &type);
     Record("create %s %d %d type=0x%x content=%s", id.c_str(), w, h, type, content ? "yes" : "no");
-    auto* parent = static_cast<Evas_Object*>(widget_get_evas_object(context));
     Drawn& drawn = gDrawn[id];
     drawn.id = id;
-    drawn.window = parent ? elm_win_tizen_widget_add("test-widget", parent) : nullptr;
+    // 4x4 instances take the framework's shortcut to their window.
+    if (type == WIDGET_SIZE_TYPE_4x4)
+        widget_app_get_elm_win(context, &drawn.window);
+    else if (auto* parent = static_cast<Evas_Object*>(widget_get_evas_object(context)))
+    {
+        drawn.window = elm_win_tizen_widget_add("test-widget", parent);
+        evas_object_del(parent);
+    }
     if (!drawn.window)
         return WIDGET_ERROR_FAULT;
-    evas_object_del(parent);
+    widget_app_context_set_tag(context, &drawn);
     Draw(drawn, w, h);
     evas_object_show(drawn.window);
     widget_set_extra_info(id.c_str(), nullptr, ("Test " + id.substr(id.rfind(':') + 1)).c_str(), nullptr, nullptr);
@@ -154,8 +161,12 @@ int CreateCb(widget_context_h context, bundle* content, int w, int h, void*)
 int DestroyCb(widget_context_h context, widget_app_destroy_type_e reason, bundle* content, void*)
 {
     std::string id = IdOf(context);
-    Record("destroy %s reason=%d content=%s", id.c_str(), reason, content ? "yes" : "no");
+    void* tag = nullptr;
+    widget_app_context_get_tag(context, &tag);
     auto found = gDrawn.find(id);
+    bool tagKept = found != gDrawn.end() && tag == &found->second;
+    Record("destroy %s reason=%d content=%s tag=%s", id.c_str(), reason, content ? "yes" : "no",
+           tagKept ? "kept" : "lost");
     if (found != gDrawn.end())
     {
         evas_object_del(found->second.window);
@@ -226,11 +237,32 @@ void LowBatteryCb(app_event_info_h info, void*)
     widget_app_exit();
 }
 
+bool CollectContextCb(widget_context_h context, void* data)
+{
+    auto* ids = static_cast<std::string*>(data);
+    *ids += " " + IdOf(context);
+    return true;
+}
+
+bool FirstContextCb(widget_context_h context, void* data)
+{
+    *static_cast<widget_context_h*>(data) = context;
+    return false;
+}
+
+// Low memory makes the widget give up its first instance.
 void LowMemoryCb(app_event_info_h info, void*)
 {
     app_event_low_memory_status_e status = APP_EVENT_LOW_MEMORY_NORMAL;
     app_event_get_low_memory_status(info, &status);
     Record("event low-memory %d", status);
+    std::string ids;
+    int all = widget_app_foreach_context(CollectContextCb, &ids);
+    widget_context_h first = nullptr;
+    int stopped = widget_app_foreach_context(FirstContextCb, &first);
+    Record("contexts%s all=%d stopped=%d", ids.c_str(), all, stopped);
+    if (first)
+        Record("terminate %s %d", IdOf(first).c_str(), widget_app_terminate_context(first));
 }
 
 widget_class_h AppCreateCb(void*)

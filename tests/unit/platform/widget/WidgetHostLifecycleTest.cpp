@@ -1,6 +1,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <sys/stat.h>
 
 #include "WidgetHostFixture.h"
@@ -63,7 +64,7 @@ TEST_F(WidgetHostTest, DestroyingOneInstanceLeavesTheOtherDrawn)
     std::string second = CreateInstance("4x4");
     EXPECT_EQ(Send("destroy " + first), "OK");
     EXPECT_THAT(CallbacksOf(Records(), first), ElementsAre("create", "resize", "resume", "pause", "destroy"));
-    EXPECT_THAT(Records("destroy"), ElementsAre("destroy " + first + " reason=0 content=yes"));
+    EXPECT_THAT(Records("destroy"), ElementsAre("destroy " + first + " reason=0 content=yes tag=kept"));
     EXPECT_EQ(Send("list"), "OK 1\n" + second + "\t4x4\tTest 2\trunning");
     EXPECT_EQ(Send("tap " + first + " 10 10").compare(0, 4, "ERR "), 0);
     EXPECT_EQ(Send("tap " + second + " 10 10").compare(0, 3, "OK "), 0);
@@ -154,6 +155,23 @@ TEST_F(WidgetHostTest, RegionAndLowMemoryKeysRaiseTheirEventsOnlyForQualifyingVa
     EXPECT_THAT(Send("event orientation"), HasSubstr("ERR usage"));
 }
 
+TEST_F(WidgetHostTest, WidgetCanWalkItsContextsAndEndOneOfThem)
+{
+    StartHost();
+    std::string first = CreateInstance("4x2");
+    std::string second = CreateInstance("4x4");
+    EXPECT_EQ(Send("event low-memory"), "OK");
+    WaitIdle();
+    EXPECT_THAT(Records("contexts"), ElementsAre("contexts " + first + " " + second + " all=0 stopped=" +
+                                                 std::to_string(WIDGET_ERROR_CANCELED)));
+    EXPECT_THAT(Records("terminate"), ElementsAre("terminate " + first + " 0"));
+    auto callbacks = CallbacksOf(Records(), first);
+    callbacks.erase(std::remove(callbacks.begin(), callbacks.end(), "timer"), callbacks.end());
+    EXPECT_THAT(callbacks, ElementsAre("create", "resize", "resume", "contexts", "terminate", "pause", "destroy"));
+    EXPECT_THAT(Records("destroy"), ElementsAre("destroy " + first + " reason=0 content=yes tag=kept"));
+    EXPECT_EQ(Send("list"), "OK 1\n" + second + "\t4x4\tTest 2\trunning");
+}
+
 TEST_F(WidgetHostTest, LowBatteryEndsTheProcessAfterDestroyingItsInstances)
 {
     StartHost();
@@ -163,7 +181,7 @@ TEST_F(WidgetHostTest, LowBatteryEndsTheProcessAfterDestroyingItsInstances)
     auto records = Records();
     ASSERT_GE(records.size(), 4u);
     EXPECT_THAT(std::vector<std::string>(records.end() - 5, records.end()),
-                ElementsAre("event low-battery 2", "pause " + id, "destroy " + id + " reason=5 content=yes",
+                ElementsAre("event low-battery 2", "pause " + id, "destroy " + id + " reason=5 content=yes tag=kept",
                             "app-terminate", "main-returned 0"));
     struct stat info;
     EXPECT_NE(stat(SocketPath().c_str(), &info), 0) << "the socket outlived its host";
