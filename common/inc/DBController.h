@@ -43,7 +43,8 @@ public:
     bool IsCurrentLocationExist();
 
     // Writers return ERR_OK or ERR_FAIL. A city with the location id and
-    // current-location flag of a stored one is not inserted (ERR_FAIL).
+    // current-location flag of a stored one is not inserted (ERR_FAIL); a
+    // city that is not stored is not updated (ERR_FAIL).
     int InsertCityData(CityPtr cityPtr);
     int UpdateCityData(CityPtr cityPtr);
     // The count never drops below 0.
@@ -74,7 +75,7 @@ private:
     CityPtrVectorPtr SelectAllCities(CityDBController& cityDBController);
     bool InsertIfNew(CityDBController& cityDBController, CityPtr cityPtr);
     void InsertDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr);
-    void UpdateDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr);
+    bool UpdateDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr);
     void DeleteDataWithPrimaryKey(CityDBController& cityDBController, int primaryKey);
     void DeleteAll(CityDBController& cityDBController);
     int ResolvePageIndex(CityDBController& cityDBController, const CityPtr& cityPtr);

@@ -279,10 +279,12 @@ int DBController::ResolvePageIndex(CityDBController& cityDBController, const Cit
     return cityPtr->GetPageIndex();
 }
 
-void DBController::UpdateDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr)
+bool DBController::UpdateDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr)
 {
-    COMMON_RET_IF(!cityPtr);
+    COMMON_RETV_IF(!cityPtr, false);
     int primaryKey = cityDBController.GetPrimaryKey(ResolvePageIndex(cityDBController, cityPtr));
+    // Without a city row the forecast inserts below would leave orphan rows.
+    COMMON_RETV_IF(primaryKey < 1, false);
     cityDBController.Update(cityPtr, primaryKey);
     CurrentWeatherDBController().Update(primaryKey, cityPtr->GetCurrentPtr());
     WeeklyWeatherDBController().Update(primaryKey, cityPtr->GetWeeklyPtrVector());
@@ -290,6 +292,7 @@ void DBController::UpdateDataWithCityPtr(CityDBController& cityDBController, Cit
     hourlyDBController.Delete(primaryKey);
     hourlyDBController.Insert(primaryKey, cityPtr->GetHourlyPtrVector());
     ExtraWeatherDBController().Update(primaryKey, cityPtr->GetExtraPtr());
+    return true;
 }
 
 int DBController::UpdateCityData(CityPtr cityPtr)
@@ -299,8 +302,7 @@ int DBController::UpdateCityData(CityPtr cityPtr)
     COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
     CycleCloser cycle(dbConnector);
     CityDBController cityDBController;
-    UpdateDataWithCityPtr(cityDBController, cityPtr);
-    return ERR_OK;
+    return UpdateDataWithCityPtr(cityDBController, cityPtr) ? ERR_OK : ERR_FAIL;
 }
 
 int DBController::UpdateOnlyWidgetReferenceCount(const std::string& locationID, bool isIncrease)
@@ -413,6 +415,7 @@ int DBController::UpdateOnlyMoonPhaseData(CityPtr cityPtr)
     CycleCloser cycle(dbConnector);
     CityDBController cityDBController;
     int primaryKey = cityDBController.GetPrimaryKey(ResolvePageIndex(cityDBController, cityPtr));
+    COMMON_RETV_IF(primaryKey < 1, ERR_FAIL);
     MoonPhaseDBController moonPhaseDBController;
     moonPhaseDBController.Delete(cityPtr->GetLocationId());
     moonPhaseDBController.Insert(primaryKey, cityPtr->GetMoonPhasePtrVector());

@@ -80,7 +80,9 @@ protected:
             mLog.Clear();
             EXPECT_TRUE(op.run(db)) << op.name;
             if (std::string(op.name) != "GetIsWeatherInfoExpired")
+            {
                 EXPECT_TRUE(mLog.Contains(op.isReader ? kReadFailure : kWriteFailure)) << op.name << mLog.Dump();
+            }
             EXPECT_FALSE(DBConnector::GetInstance()->GetIsOpened()) << op.name;
         }
     }

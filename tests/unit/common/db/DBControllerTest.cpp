@@ -200,6 +200,21 @@ TEST_F(DBControllerTest, UpdateRewritesInPlace)
     EXPECT_EQ(mDB.SelectCityData(0)->GetCityName(), "city A-0");
 }
 
+TEST_F(DBControllerTest, CityThatIsNotStoredLeavesNoOrphanRows)
+{
+    InsertCities({"A"});
+    CityPtr stranger = MakeCity("Z", 1);
+    stranger->SetPageIndex(-1);
+    EXPECT_EQ(mDB.UpdateCityData(stranger), ERR_FAIL);
+    EXPECT_EQ(mDB.UpdateOnlyMoonPhaseData(stranger), ERR_FAIL);
+    EXPECT_TRUE(mLog.Contains("(primaryKey < 1) [return]"));
+    RawDB raw(WeatherDBPath());
+    for (const char* table : {"CURRENT_WEATHER_TABLE", "WEEKLY_WEATHER_TABLE", "HOURLY_WEATHER_TABLE",
+                              "EXTRA_WEATHER_TABLE", "MOON_PHASE_TABLE"})
+        EXPECT_EQ(raw.Int(std::string("SELECT COUNT(*) FROM ") + table + " WHERE FK_ID < 1;"), 0) << table;
+    EXPECT_EQ(mDB.SelectCityData(0)->GetCityName(), "city A-0");
+}
+
 TEST_F(DBControllerTest, ShorterWeeklyListLeavesSurplusRows)
 {
     InsertCities({"A"});

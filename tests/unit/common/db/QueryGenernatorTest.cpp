@@ -40,17 +40,6 @@ TEST(QueryGenernator, WriteStatementsKeepTheirBlanks)
     EXPECT_EQ(gen.MakeDeleteQuery("T", gen.MakeWhereClause("x = 1")), "DELETE FROM T WHERE x = 1");
 }
 
-TEST(QueryGenernator, JoinFunctionAndLimitTexts)
-{
-    QueryGenernator gen;
-    EXPECT_EQ(gen.MakeJoinSelectQuery("*", "SELECT a FROM L", "SELECT b FROM R", "a", "b", "WHERE a > 1"),
-              "SELECT * FROM (SELECT a FROM L) leftTable LEFT OUTER JOIN (SELECT b FROM R) rightTable ON "
-              "leftTable.a=rightTable.b WHERE a > 1");
-    EXPECT_EQ(gen.MakeFunctionText("MAX", "PK_ID"), "MAX(PK_ID)");
-    EXPECT_EQ(gen.MakeLimitClause(std::string("10")), "LIMIT 10");
-    EXPECT_EQ(gen.MakeOrderByClause("PK_ID", true), "ORDER BY PK_ID ASC");
-}
-
 TEST(QueryGenernator, ConditionsJoinByConjunction)
 {
     QueryGenernator gen;
