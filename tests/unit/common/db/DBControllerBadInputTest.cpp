@@ -11,6 +11,7 @@
 #include "DBConnector.h"
 #include "DBTestSupport.h"
 #include "FileUtil.h"
+#include "SettingDBController.h"
 #include "WeatherDefine.h"
 
 using namespace NSWeather;
@@ -165,4 +166,12 @@ TEST_F(DBControllerBadInputTest, ForeignSchemaGivesEmptyResults)
     RawDB raw(WeatherDBPath());
     EXPECT_EQ(raw.Column("SELECT name FROM CITY_TABLE;"), (std::vector<std::string>{"theirs", "also theirs"}));
     EXPECT_EQ(raw.Column("SELECT body FROM notes;"), (std::vector<std::string>{"keep"}));
+}
+
+TEST_F(DBControllerBadInputTest, UnreadableCitiesAreNotExpired)
+{
+    ASSERT_EQ(SettingDBController().Initialize(), ERR_OK);
+    ReplaceWeatherDB(std::string(2048, '\x01'));
+    EXPECT_FALSE(DBController().GetIsWeatherInfoExpired());
+    EXPECT_TRUE(mLog.Contains("(cityPtrVector == NULL) [return]")) << mLog.Dump();
 }
