@@ -10,23 +10,18 @@
 namespace WeatherTest
 {
 
-// Restores an environment variable when it goes.
+// Sets an environment variable for the test and restores it afterwards.
 class ScopedEnv
 {
 public:
-    explicit ScopedEnv(const char* name) : mName(name)
+    explicit ScopedEnv(const char* name) : mName(name), mHad(getenv(name) != nullptr)
     {
-        const char* old = getenv(name);
-        mHad = old != nullptr;
         if (mHad)
-            mOld = old;
+            mOld = getenv(name);
     }
     ~ScopedEnv()
     {
-        if (mHad)
-            setenv(mName.c_str(), mOld.c_str(), 1);
-        else
-            unsetenv(mName.c_str());
+        mHad ? setenv(mName.c_str(), mOld.c_str(), 1) : unsetenv(mName.c_str());
         tzset();
     }
     void Set(const char* value)
@@ -37,12 +32,11 @@ public:
 
 private:
     std::string mName;
+    bool mHad;
     std::string mOld;
-    bool mHad = false;
 };
 
-// A fresh root with the device clock, region format and language under the
-// test's control (device at UTC, en_US, 24-hour clock unless changed).
+// A fresh root with the device at UTC and the region format en_US.
 class TimeTest : public PlatformTest
 {
 protected:
@@ -50,11 +44,9 @@ protected:
     {
         mTz.Set("UTC");
         mLcTime.Set("en_US.UTF-8");
-        mLang.Set("C.UTF-8");
     }
     ScopedEnv mTz{"TZ"};
     ScopedEnv mLcTime{"LC_TIME"};
-    ScopedEnv mLang{"LANG"};
 };
 
 // 2026-07-14 00:00:00 UTC, a Tuesday.

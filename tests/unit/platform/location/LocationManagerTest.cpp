@@ -43,7 +43,7 @@ TEST_F(LocationManagerTest, UnreadableSettingIsAFailureNotAnAnswer)
     EXPECT_TRUE(mLog.Contains(VCONFKEY_LOCATION_USE_MY_LOCATION, "LOCATION_MANAGER")) << mLog.Dump();
 }
 
-TEST_F(LocationManagerTest, MethodsOutsideTheRangeAreIncorrect)
+TEST_F(LocationManagerTest, BadMethodsAndHandlesAreRefused)
 {
     bool enabled = false;
     vconf_set_int(VCONFKEY_LOCATION_USE_MY_LOCATION, 1);
@@ -52,11 +52,6 @@ TEST_F(LocationManagerTest, MethodsOutsideTheRangeAreIncorrect)
               LOCATIONS_ERROR_INCORRECT_METHOD);
     EXPECT_EQ(location_manager_is_enabled_method(LOCATIONS_METHOD_HYBRID, nullptr),
               LOCATIONS_ERROR_INVALID_PARAMETER);
-    EXPECT_EQ(static_cast<unsigned>(LOCATIONS_ERROR_INCORRECT_METHOD), 0xFD400001u);
-}
-
-TEST_F(LocationManagerTest, ManagersAreCreatedAndDestroyedOnce)
-{
     location_manager_h manager = nullptr;
     ASSERT_EQ(location_manager_create(LOCATIONS_METHOD_HYBRID, &manager), LOCATIONS_ERROR_NONE);
     ASSERT_NE(manager, nullptr);

@@ -8,34 +8,30 @@
 namespace WeatherTest
 {
 
-// Runs the Ecore main loop until `done` holds or `timeoutSeconds` pass;
-// returns whether `done` held.
+// Runs the Ecore main loop until `done` holds or `timeoutSeconds` pass.
 inline bool RunLoopUntil(const std::function<bool()>& done, double timeoutSeconds)
 {
-    struct State
-    {
-        const std::function<bool()>* done;
-        bool timedOut;
-    } state{&done, false};
-    Ecore_Timer* poll = ecore_timer_add(0.01, [](void* data) -> Eina_Bool {
-        if ((*static_cast<State*>(data)->done)())
+    auto poll = [](void* data) -> Eina_Bool {
+        if ((*static_cast<const std::function<bool()>*>(data))())
             ecore_main_loop_quit();
         return ECORE_CALLBACK_RENEW;
-    }, &state);
-    Ecore_Timer* timeout = ecore_timer_add(timeoutSeconds, [](void* data) -> Eina_Bool {
-        static_cast<State*>(data)->timedOut = true;
+    };
+    auto quit = [](void* data) -> Eina_Bool {
+        *static_cast<Ecore_Timer**>(data) = nullptr;
         ecore_main_loop_quit();
         return ECORE_CALLBACK_CANCEL;
-    }, &state);
+    };
+    Ecore_Timer* pollTimer = ecore_timer_add(0.01, poll, const_cast<std::function<bool()>*>(&done));
+    Ecore_Timer* timeout = nullptr;
+    timeout = ecore_timer_add(timeoutSeconds, quit, &timeout);
     if (!done())
         ecore_main_loop_begin();
-    ecore_timer_del(poll);
-    if (!state.timedOut)
+    ecore_timer_del(pollTimer);
+    if (timeout)
         ecore_timer_del(timeout);
     return done();
 }
 
-// Lets the main loop deliver whatever is pending for `seconds`.
 inline void RunLoopFor(double seconds)
 {
     RunLoopUntil([] { return false; }, seconds);
