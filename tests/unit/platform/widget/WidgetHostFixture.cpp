@@ -34,7 +34,8 @@ std::string WidgetHostTest::SocketPath() const
     return mRoot.Path(std::string("run/widget/") + kWidgetId + ".ctl");
 }
 
-pid_t WidgetHostTest::Spawn(const std::vector<std::string>& args, const std::string& outputName)
+pid_t WidgetHostTest::Spawn(const std::vector<std::string>& args, const std::string& outputName,
+                            const std::string& display)
 {
     std::vector<std::string> all = {TEST_WIDGET_APP, "--widget-id", kWidgetId};
     all.insert(all.end(), args.begin(), args.end());
@@ -47,8 +48,11 @@ pid_t WidgetHostTest::Spawn(const std::vector<std::string>& args, const std::str
         int fd = open(output.c_str(), O_WRONLY | O_CREAT | O_APPEND, 0600);
         dup2(fd, 1);
         dup2(fd, 2);
-        unsetenv("DISPLAY");
         unsetenv("WAYLAND_DISPLAY");
+        if (display.empty())
+            unsetenv("DISPLAY");
+        else
+            setenv("DISPLAY", display.c_str(), 1);
         setenv("TEST_WIDGET_RECORD", record.c_str(), 1);
         std::vector<char*> argv;
         for (auto& arg : all)
@@ -60,9 +64,56 @@ pid_t WidgetHostTest::Spawn(const std::vector<std::string>& args, const std::str
     return pid;
 }
 
-void WidgetHostTest::StartHost(const std::vector<std::string>& args)
+std::string WidgetHostTest::StartXServer()
 {
-    mHostPid = Spawn(args, "host.out");
+    const char* const server = "/usr/bin/Xvfb";
+    const char* const manager = "/usr/bin/openbox";
+    int fds[2];
+    if (access(server, X_OK) != 0 || access(manager, X_OK) != 0 || pipe(fds) != 0)
+        return std::string();
+    mXServerPid = fork();
+    if (mXServerPid == 0)
+    {
+        close(fds[0]);
+        int out = open("/dev/null", O_WRONLY);
+        dup2(out, 1);
+        dup2(out, 2);
+        std::string fd = std::to_string(fds[1]);
+        execl(server, server, "-displayfd", fd.c_str(), "-screen", "0", "1280x1024x24", "-nolisten", "tcp",
+              static_cast<char*>(nullptr));
+        _exit(127);
+    }
+    close(fds[1]);
+    // The server writes its display number once it accepts clients.
+    std::string number;
+    char c = 0;
+    while (read(fds[0], &c, 1) == 1 && c != '\n')
+        number += c;
+    close(fds[0]);
+    if (number.empty())
+        return std::string();
+    std::string display = ":" + number;
+    std::string started = mRoot.Path("wm-started");
+    mWindowManagerPid = fork();
+    if (mWindowManagerPid == 0)
+    {
+        int out = open("/dev/null", O_WRONLY);
+        dup2(out, 1);
+        dup2(out, 2);
+        setenv("DISPLAY", display.c_str(), 1);
+        std::string startup = "touch " + started;
+        execl(manager, manager, "--startup", startup.c_str(), static_cast<char*>(nullptr));
+        _exit(127);
+    }
+    auto deadline = std::chrono::steady_clock::now() + std::chrono::duration<double>(kStartSeconds);
+    while (access(started.c_str(), F_OK) != 0 && std::chrono::steady_clock::now() < deadline)
+        std::this_thread::sleep_for(std::chrono::milliseconds(20));
+    return access(started.c_str(), F_OK) == 0 ? display : std::string();
+}
+
+void WidgetHostTest::StartHost(const std::vector<std::string>& args, const std::string& display)
+{
+    mHostPid = Spawn(args, "host.out", display);
     ASSERT_GT(mHostPid, 0);
     auto deadline = std::chrono::steady_clock::now() + std::chrono::duration<double>(kStartSeconds);
     while (!mClient.Connect(SocketPath()))
@@ -111,6 +162,19 @@ int WidgetHostTest::WaitForExit(double seconds)
 }
 
 void WidgetHostTest::TearDown()
+{
+    StopHost();
+    for (pid_t pid : {mWindowManagerPid, mXServerPid})
+    {
+        if (pid > 0)
+        {
+            kill(pid, SIGTERM);
+            waitpid(pid, nullptr, 0);
+        }
+    }
+}
+
+void WidgetHostTest::StopHost()
 {
     if (mHostPid <= 0)
         return;

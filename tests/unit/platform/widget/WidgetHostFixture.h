@@ -20,11 +20,17 @@ protected:
     static const char* const kWidgetId;
 
     void TearDown() override;
+    void StopHost();
 
-    // Starts the host with extra arguments and waits for its socket.
-    void StartHost(const std::vector<std::string>& args = {});
+    // Starts the host with extra arguments and waits for its socket; with a
+    // display name its windows go to that X display.
+    void StartHost(const std::vector<std::string>& args = {}, const std::string& display = std::string());
+    // Starts a private X server with a window manager (Elementary paints no
+    // window without one); its display name, or "" when either is missing.
+    std::string StartXServer();
     // Starts a second process without waiting; returns its pid.
-    pid_t Spawn(const std::vector<std::string>& args, const std::string& outputName);
+    pid_t Spawn(const std::vector<std::string>& args, const std::string& outputName,
+                const std::string& display = std::string());
     // The reply to one command ("" when the host did not answer).
     std::string Send(const std::string& command);
     // "OK <id>" of a create, reduced to the id.
@@ -39,6 +45,8 @@ protected:
     std::string SocketPath() const;
 
     pid_t mHostPid = -1;
+    pid_t mXServerPid = -1;
+    pid_t mWindowManagerPid = -1;
     platform::ControlClient mClient;
 };
 

@@ -60,6 +60,26 @@ TEST_F(WidgetHostTest, SnapshotWritesAPictureOfTheInstanceSize)
     EXPECT_EQ(Load(square).height, 712);
 }
 
+TEST_F(WidgetHostTest, OnADisplayWindowsAreDrawnAndPicturedToo)
+{
+    std::string display = StartXServer();
+    if (display.empty())
+        GTEST_SKIP() << "no X server (Xvfb) on this machine";
+    StartHost({"--instance", "4x2", "--instance", "4x4"}, display);
+    std::string list = Send("list");
+    auto words = Words(list);
+    ASSERT_GE(words.size(), 12u) << list;
+    const std::string& square = words[7];
+    WaitIdle();
+    std::string file = mRoot.Path("display.png");
+    EXPECT_EQ(Send("snapshot " + square + " " + file), "OK " + file + " 712x712");
+    Picture picture = Load(file);
+    EXPECT_EQ(picture.width, 712);
+    EXPECT_EQ(picture.height, 712);
+    EXPECT_EQ(picture.colours.count(0xff143ca0u), 1u);
+    EXPECT_GE(picture.colours.size(), 3u);
+}
+
 TEST_F(WidgetHostTest, SnapshotToAnUnwritablePlaceIsAnError)
 {
     StartHost();
