@@ -37,7 +37,8 @@ extern "C" {
  *   <ChangeableFontTable>
  *     <Font code="T0311" name="Sans:style=Bold" size="34"/>
  *   </ChangeableFontTable>
- * A size of 0 or less keeps the size of the layout.
+ * Without a size, or with 0, each layout keeps its own size; a negative
+ * size is a percentage of it (Edje text class sizes).
  */
 
 /* System keys behind the change notifications. */

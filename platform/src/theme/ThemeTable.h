@@ -40,7 +40,7 @@ struct ThemeSection
 struct FontEntry
 {
     std::string name;  // empty: the layout's font
-    int size = 0;      // 0 or less: the layout's size
+    int size = 0;      // 0: the layout's size; negative: a percentage of it
 };
 
 // Parses "#RRGGBB" or "#RRGGBBAA" (alpha 255 when omitted).

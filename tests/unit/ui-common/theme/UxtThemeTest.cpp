@@ -181,9 +181,6 @@ TEST_F(UxtThemeTest, ChangedCallbacksFollowTheirOwnKeys)
               UXT_THEME_ERROR_NONE);
     EXPECT_EQ(uxt_theme_add_changed_callback(UXT_THEME_CHANGED_TYPE_COLOR, ChangeCounter::CountCb, &colour),
               UXT_THEME_ERROR_INVALID_PARAMETER);
-    EXPECT_EQ(uxt_theme_add_changed_callback(static_cast<uxt_theme_changed_type_e>(2), ChangeCounter::CountCb,
-                                             &colour),
-              UXT_THEME_ERROR_INVALID_PARAMETER);
 
     ASSERT_EQ(vconf_set_int(UXT_THEME_KEY_THEME, 2), VCONF_OK);
     EXPECT_TRUE(RunLoopUntil([&] { return colour.calls > 0; }));
