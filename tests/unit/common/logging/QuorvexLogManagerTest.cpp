@@ -123,21 +123,6 @@ TEST_F(QuorvexLogManagerTest, UnknownDetailSendsAnEmptyExtra)
     EXPECT_TRUE(mLog.Contains("Default error : -1"));
 }
 
-TEST_F(QuorvexLogManagerTest, DetailNamesFollowTheTable)
-{
-    const char* const names[] = {"use_current_location_option", "use_current_location_button_click",
-                                 "search_city_list_click", "forecast_hourly_click", "forecast_daily_click",
-                                 "auto_refresh_option_every_1_hour", "auto_refresh_option_every_3_hours",
-                                 "auto_refresh_option_every_6_hours", "auto_refresh_option_every_12_hours",
-                                 "auto_refresh_option_never", "enter_accuweather", "use_lock_screen_option",
-                                 "number_of_registered_city", "widget_empty", "added_widget_4x4",
-                                 "added_widget_4x2", "widget_alive"};
-    for (int i = 0; i < 17; ++i)
-        EXPECT_EQ(names[i], QuorvexLogManager::GetExtraStringByDetailFeatureNumber(i)) << i;
-    EXPECT_EQ("", QuorvexLogManager::GetUri(2));
-    EXPECT_EQ("", QuorvexLogManager::GetUri(-1));
-}
-
 TEST_F(QuorvexLogManagerTest, UnknownUriTypeIsNotStored)
 {
     mManager->Create();
