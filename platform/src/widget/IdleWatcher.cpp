@@ -59,6 +59,7 @@ void IdleWatcher::HookCanvases()
 
 void IdleWatcher::RenderPostCb(void* data, Evas*, void* eventInfo)
 {
+    // Only draws that changed pixels count; the data is the watcher itself.
     auto* post = static_cast<Evas_Event_Render_Post*>(eventInfo);
     if (!data || (post && !post->updated_area))
         return;
@@ -70,9 +71,16 @@ Eina_Bool IdleWatcher::TickCb(void* data)
     auto* waiter = static_cast<Waiter*>(data);
     if (!waiter)
         return ECORE_CALLBACK_CANCEL;
-    // The check runs from an idler: it only gets there once queued jobs ran.
-    if (!waiter->idler)
-        waiter->idler = ecore_idler_add(IdlerCb, waiter);
+    try
+    {
+        // The check runs from an idler: it only gets there once queued jobs ran.
+        if (!waiter->idler)
+            waiter->idler = ecore_idler_add(IdlerCb, waiter);
+    }
+    catch (...)
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "idle tick failed with an exception");
+    }
     return ECORE_CALLBACK_RENEW;
 }
 

@@ -5,6 +5,7 @@
 #include <cstring>
 
 #include "dlog.h"
+#include "widget/WidgetHost.h"
 
 namespace platform
 {
@@ -121,6 +122,7 @@ Evas_Object* WidgetInstance::CreateWindow(const char* name)
         elm_win_borderless_set(mWindow, EINA_TRUE);
     evas_object_resize(mWindow, mWidth, mHeight);
     evas_object_event_callback_add(mWindow, EVAS_CALLBACK_DEL, WindowDelCb, this);
+    evas_object_smart_callback_add(mWindow, "delete,request", CloseRequestCb, this);
     return mWindow;
 }
 
@@ -133,7 +135,14 @@ void WidgetInstance::WindowDelCb(void* data, Evas*, Evas_Object*, void*)
 {
     if (!data)
         return;
-    static_cast<WidgetInstance*>(data)->OnWindowDeleted();
+    try
+    {
+        static_cast<WidgetInstance*>(data)->OnWindowDeleted();
+    }
+    catch (...)
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "window deletion failed with an exception");
+    }
 }
 
 void WidgetInstance::ParentDelCb(void* data, Evas*, Evas_Object*, void*)
@@ -141,6 +150,22 @@ void WidgetInstance::ParentDelCb(void* data, Evas*, Evas_Object*, void*)
     if (!data)
         return;
     static_cast<WidgetInstance*>(data)->mParentObject = nullptr;
+}
+
+// Closing a window on a display removes the instance, as removing it from a
+// home screen would; the end itself runs later on the main loop.
+void WidgetInstance::CloseRequestCb(void* data, Evas_Object*, void*)
+{
+    if (!data)
+        return;
+    try
+    {
+        WidgetHost::GetInstance().TerminateContext(static_cast<WidgetInstance*>(data));
+    }
+    catch (...)
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "closing a window failed with an exception");
+    }
 }
 
 void WidgetInstance::OnWindowDeleted()

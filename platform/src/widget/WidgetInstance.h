@@ -73,6 +73,7 @@ public:
 private:
     static void WindowDelCb(void* data, Evas* evas, Evas_Object* obj, void* eventInfo);
     static void ParentDelCb(void* data, Evas* evas, Evas_Object* obj, void* eventInfo);
+    static void CloseRequestCb(void* data, Evas_Object* obj, void* eventInfo);
     void OnWindowDeleted();
 
     std::string mId;

@@ -23,6 +23,7 @@ struct Drawn
     Evas_Object* window = nullptr;
     Evas_Object* background = nullptr;
     Evas_Object* block = nullptr;
+    unsigned downTimestamp = 0;
 };
 
 std::map<std::string, Drawn> gDrawn;
@@ -52,8 +53,10 @@ void MouseDownCb(void* data, Evas*, Evas_Object*, void* info)
 {
     auto* drawn = static_cast<Drawn*>(data);
     auto* event = static_cast<Evas_Event_Mouse_Down*>(info);
-    if (drawn && event)
-        Record("mouse-down %s %d %d %u", drawn->id.c_str(), event->canvas.x, event->canvas.y, event->timestamp);
+    if (!drawn || !event)
+        return;
+    drawn->downTimestamp = event->timestamp;
+    Record("mouse-down %s %d %d %u", drawn->id.c_str(), event->canvas.x, event->canvas.y, event->timestamp);
 }
 
 void MouseMoveCb(void* data, Evas*, Evas_Object*, void* info)
@@ -71,7 +74,8 @@ void TransitEndCb(void*, Elm_Transit*)
 }
 
 // A tap also starts a short animation and asks for an update of the instance,
-// so that idle and trigger_update can be watched.
+// so that idle and trigger_update can be watched. A press of a second or more
+// asks to close the window, as a window manager would.
 void MouseUpCb(void* data, Evas*, Evas_Object*, void* info)
 {
     auto* drawn = static_cast<Drawn*>(data);
@@ -79,6 +83,12 @@ void MouseUpCb(void* data, Evas*, Evas_Object*, void* info)
     if (!drawn || !event)
         return;
     Record("mouse-up %s %d %d %u", drawn->id.c_str(), event->canvas.x, event->canvas.y, event->timestamp);
+    if (event->timestamp - drawn->downTimestamp >= 1000)
+    {
+        Record("close-request %s", drawn->id.c_str());
+        evas_object_smart_callback_call(drawn->window, "delete,request", nullptr);
+        return;
+    }
     Elm_Transit* transit = elm_transit_add();
     elm_transit_object_add(transit, drawn->block);
     elm_transit_effect_translation_add(transit, 0, 0, 40, 0);
