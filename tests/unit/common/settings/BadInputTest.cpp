@@ -79,20 +79,6 @@ TEST_F(BadInputTest, EmptyForeignSettingTableTakesNoRowAndSaysSo)
     ExpectEmptyReadings();
 }
 
-TEST_F(BadInputTest, SettingsWithTextWhereNumbersBelongReadAsZero)
-{
-    InitializeSettings();
-    SetSettingColumn("TemperatureUnit", "'celsius'");
-    SetSettingColumn("AutoRefreshOn", "NULL");
-    SetSettingColumn("CpType", "NULL");
-    SettingPtr read = SettingDBController().Select();
-    ASSERT_TRUE(read);
-    EXPECT_EQ(0, read->GetTemperatureUnit());
-    EXPECT_FALSE(read->GetAutoRefreshOn());
-    EXPECT_EQ("", read->GetCpType());
-    EXPECT_EQ(CP_ACCUWEATHER, ContentProvider::GetContentProvider());
-}
-
 TEST_F(BadInputTest, OtherDatabasesOfRandomBytesDoNotStopTheStart)
 {
     MakeDBDir();

@@ -1,3 +1,5 @@
+#include <sstream>
+
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -15,111 +17,75 @@ class SettingDBControllerTest : public SettingsTest::SettingsFixture
 {
 };
 
-// Every field away from its default, so a swapped or dropped column shows.
-SettingPtr MakeDistinctSetting()
+// All 25 fields in column order, so that a swapped or dropped column shows.
+std::string Describe(const Setting& s)
 {
-    auto s = std::make_shared<Setting>();
-    s->SetCurrentCityIndex(3);
-    s->SetCurrentCityLocationId("loc-1'; DROP TABLE SETTING_TABLE;--");
-    s->SetTemperatureUnit(0);
-    s->SetLastRefreshedTime(static_cast<time_t>(2000000001));
-    s->SetCurrentLocationAreaRefreshedTime(static_cast<time_t>(2000000002));
-    s->SetIsFirstLaunch(false);
-    s->SetAutoRefreshOn(false);
-    s->SetAutoRefreshInterval(12);
-    s->SetUseCurrentLocationOn(true);
-    s->SetShowCurrentCityAgreement(true);
-    s->SetRefreshOnOpeningOn(true);
-    s->SetRefreshOnOpeningOnAgreement(true);
-    s->SetNotificationOn(true);
-    s->SetNotificationTime(static_cast<time_t>(2000000003));
-    s->SetNetworkPositionPopupAgreement(true);
-    s->SetShowNetworkPopup(true);
-    s->SetChinaDataGPSPerformPopupOn(true);
-    s->SetAutoScrollOn(true);
-    s->SetAutoScrollInterval(7);
-    s->SetLastUpdateLanguageCode("ko");
-    s->SetCpType("Kweather");
-    s->SetDaemonType("OTHER_DAEMON");
-    s->SetIsNowRefreshing(true);
-    s->SetIsSupportManualRefresh(true);
-    s->SetRefreshingStartTime(static_cast<time_t>(2000000004));
-    return s;
+    std::ostringstream out;
+    out << s.GetCurrentCityIndex() << '|' << s.GetCurrentCityLocationId() << '|' << s.GetTemperatureUnit() << '|'
+        << s.GetLastRefreshedTime() << '|' << s.GetCurrentLocationAreaRefreshedTime() << '|' << s.GetIsFirstLaunch()
+        << s.GetAutoRefreshOn() << '|' << s.GetAutoRefreshInterval() << '|' << s.GetUseCurrentLocationOn()
+        << s.GetShowCurrentCityAgreement() << s.GetRefreshOnOpeningOn() << s.GetRefreshOnOpeningOnAgreement()
+        << s.GetNotificationOn() << '|' << s.GetNotificationTime() << '|' << s.GetNetworkPositionPopupAgreement()
+        << s.GetShowNetworkPopup() << s.GetChinaDataGPSPerformPopupOn() << s.GetAutoScrollOn() << '|'
+        << s.GetAutoScrollInterval() << '|' << s.GetLastUpdateLanguageCode() << '|' << s.GetCpType() << '|'
+        << s.GetDaemonType() << '|' << s.GetIsNowRefreshing() << s.GetIsSupportManualRefresh() << '|'
+        << s.GetRefreshingStartTime();
+    return out.str();
 }
 
-void ExpectSameSetting(const Setting& expected, const Setting& actual)
-{
-    EXPECT_EQ(expected.GetCurrentCityIndex(), actual.GetCurrentCityIndex());
-    EXPECT_EQ(expected.GetCurrentCityLocationId(), actual.GetCurrentCityLocationId());
-    EXPECT_EQ(expected.GetTemperatureUnit(), actual.GetTemperatureUnit());
-    EXPECT_EQ(expected.GetLastRefreshedTime(), actual.GetLastRefreshedTime());
-    EXPECT_EQ(expected.GetCurrentLocationAreaRefreshedTime(), actual.GetCurrentLocationAreaRefreshedTime());
-    EXPECT_EQ(expected.GetIsFirstLaunch(), actual.GetIsFirstLaunch());
-    EXPECT_EQ(expected.GetAutoRefreshOn(), actual.GetAutoRefreshOn());
-    EXPECT_EQ(expected.GetAutoRefreshInterval(), actual.GetAutoRefreshInterval());
-    EXPECT_EQ(expected.GetUseCurrentLocationOn(), actual.GetUseCurrentLocationOn());
-    EXPECT_EQ(expected.GetShowCurrentCityAgreement(), actual.GetShowCurrentCityAgreement());
-    EXPECT_EQ(expected.GetRefreshOnOpeningOn(), actual.GetRefreshOnOpeningOn());
-    EXPECT_EQ(expected.GetRefreshOnOpeningOnAgreement(), actual.GetRefreshOnOpeningOnAgreement());
-    EXPECT_EQ(expected.GetNotificationOn(), actual.GetNotificationOn());
-    EXPECT_EQ(expected.GetNotificationTime(), actual.GetNotificationTime());
-    EXPECT_EQ(expected.GetNetworkPositionPopupAgreement(), actual.GetNetworkPositionPopupAgreement());
-    EXPECT_EQ(expected.GetShowNetworkPopup(), actual.GetShowNetworkPopup());
-    EXPECT_EQ(expected.GetChinaDataGPSPerformPopupOn(), actual.GetChinaDataGPSPerformPopupOn());
-    EXPECT_EQ(expected.GetAutoScrollOn(), actual.GetAutoScrollOn());
-    EXPECT_EQ(expected.GetAutoScrollInterval(), actual.GetAutoScrollInterval());
-    EXPECT_EQ(expected.GetLastUpdateLanguageCode(), actual.GetLastUpdateLanguageCode());
-    EXPECT_EQ(expected.GetCpType(), actual.GetCpType());
-    EXPECT_EQ(expected.GetDaemonType(), actual.GetDaemonType());
-    EXPECT_EQ(expected.GetIsNowRefreshing(), actual.GetIsNowRefreshing());
-    EXPECT_EQ(expected.GetIsSupportManualRefresh(), actual.GetIsSupportManualRefresh());
-    EXPECT_EQ(expected.GetRefreshingStartTime(), actual.GetRefreshingStartTime());
-}
-
-TEST_F(SettingDBControllerTest, NewDatabaseHoldsOneDefaultRow)
+TEST_F(SettingDBControllerTest, NewOrEmptyTableGetsTheDefaultRowAndAStoredRowIsKept)
 {
     InitializeSettings();
-    RawDB db(SettingDBPath());
-    EXPECT_EQ(1, db.QueryInt("SELECT COUNT(*) FROM SETTING_TABLE"));
-    EXPECT_EQ("Accuweather", db.QueryText("SELECT CpType FROM SETTING_TABLE"));
-    EXPECT_EQ("RI_DAEMON", db.QueryText("SELECT DaemonType FROM SETTING_TABLE"));
-    EXPECT_EQ(6, db.QueryInt("SELECT AutoRefreshInterval FROM SETTING_TABLE"));
-    EXPECT_EQ(1, db.QueryInt("SELECT TemperatureUnit FROM SETTING_TABLE"));
-    EXPECT_EQ(1, db.QueryInt("SELECT IsFirstLaunch FROM SETTING_TABLE"));
+    SettingPtr read = SettingDBController().Select();
+    ASSERT_TRUE(read);
+    EXPECT_EQ("0||1|0|0|11|6|00000|0|0000|0|en|Accuweather|RI_DAEMON|00|0", Describe(*read));
 
-    SettingPtr selected = SettingDBController().Select();
-    ASSERT_TRUE(selected);
-    ExpectSameSetting(Setting(), *selected);
-}
-
-TEST_F(SettingDBControllerTest, InitializeKeepsAnExistingRowAndRefillsAnEmptyTable)
-{
-    InitializeSettings();
     SetSettingColumn("CpType", "'cmaweather'");
     InitializeSettings();
     RawDB db(SettingDBPath());
-    EXPECT_EQ(1, db.QueryInt("SELECT COUNT(*) FROM SETTING_TABLE"));
-    EXPECT_EQ("cmaweather", db.QueryText("SELECT CpType FROM SETTING_TABLE"));
+    EXPECT_EQ("1|cmaweather", db.QueryText("SELECT COUNT(*) || '|' || max(CpType) FROM SETTING_TABLE"));
 
     db.Exec("DELETE FROM SETTING_TABLE");
     InitializeSettings();
-    EXPECT_EQ(1, db.QueryInt("SELECT COUNT(*) FROM SETTING_TABLE"));
-    EXPECT_EQ("Accuweather", db.QueryText("SELECT CpType FROM SETTING_TABLE"));
+    EXPECT_EQ("1|Accuweather", db.QueryText("SELECT COUNT(*) || '|' || max(CpType) FROM SETTING_TABLE"));
 }
 
 TEST_F(SettingDBControllerTest, EveryColumnRoundTrips)
 {
     InitializeSettings();
-    SettingPtr written = MakeDistinctSetting();
-    SettingDBController().Update(written);
-
+    auto s = std::make_shared<Setting>();
+    s->SetCurrentCityIndex(3);
+    s->SetCurrentCityLocationId("loc'; DROP TABLE SETTING_TABLE;--");
+    s->SetTemperatureUnit(0);
+    s->SetLastRefreshedTime(2000000001);
+    s->SetCurrentLocationAreaRefreshedTime(2000000002);
+    s->SetIsFirstLaunch(false);
+    s->SetAutoRefreshInterval(12);
+    s->SetUseCurrentLocationOn(true);
+    s->SetRefreshOnOpeningOn(true);
+    s->SetNotificationTime(2000000003);
+    s->SetShowNetworkPopup(true);
+    s->SetAutoScrollOn(true);
+    s->SetAutoScrollInterval(7);
+    s->SetLastUpdateLanguageCode("ko");
+    s->SetCpType("Kweather");
+    s->SetDaemonType("OTHER_DAEMON");
+    s->SetIsSupportManualRefresh(true);
+    s->SetRefreshingStartTime(2000000004);
+    SettingDBController().Update(s);
     SettingPtr read = SettingDBController().Select();
     ASSERT_TRUE(read);
-    ExpectSameSetting(*written, *read);
-    // Times beyond 32 bits must survive in the INT64 columns.
-    RawDB db(SettingDBPath());
-    EXPECT_EQ(2000000004LL, db.QueryInt("SELECT RefreshingStartTime FROM SETTING_TABLE"));
-    EXPECT_EQ(1, db.QueryInt("SELECT COUNT(*) FROM SETTING_TABLE"));
+    EXPECT_EQ(Describe(*s), Describe(*read));
+
+    // The flags left out above flipped the other way round.
+    for (auto flip : {&Setting::SetAutoRefreshOn, &Setting::SetShowCurrentCityAgreement,
+                      &Setting::SetRefreshOnOpeningOnAgreement, &Setting::SetNotificationOn,
+                      &Setting::SetNetworkPositionPopupAgreement, &Setting::SetChinaDataGPSPerformPopupOn,
+                      &Setting::SetIsNowRefreshing})
+        ((*s).*flip)(flip != &Setting::SetAutoRefreshOn);
+    SettingDBController().Update(s);
+    EXPECT_EQ(Describe(*s), Describe(*SettingDBController().Select()));
+    EXPECT_EQ(1, RawDB(SettingDBPath()).QueryInt("SELECT COUNT(*) FROM SETTING_TABLE"));
 }
 
 TEST_F(SettingDBControllerTest, NonZeroIntegerInABooleanColumnReadsTrue)
@@ -135,7 +101,7 @@ TEST_F(SettingDBControllerTest, NonZeroIntegerInABooleanColumnReadsTrue)
     EXPECT_FALSE(read->GetAutoRefreshOn());
 }
 
-TEST_F(SettingDBControllerTest, NullRecordWritesNothing)
+TEST_F(SettingDBControllerTest, NullRecordWritesNothingAndDisplayCityWritesOneColumn)
 {
     InitializeSettings();
     SetSettingColumn("CpType", "'Kweather'");
@@ -143,98 +109,81 @@ TEST_F(SettingDBControllerTest, NullRecordWritesNothing)
     SettingDBController().Update(nullptr);
     EXPECT_EQ(before, SettingsTest::ReadFileBytes(SettingDBPath()));
     EXPECT_TRUE(mLog.Contains("(!settingPtr) [return]")) << mLog.Dump();
-    EXPECT_EQ("Kweather", SettingDBController().Select()->GetCpType());
-}
 
-TEST_F(SettingDBControllerTest, DisplayCityIdChangesOnlyThatColumn)
-{
-    InitializeSettings();
-    SetSettingColumn("CpType", "'WeatherNews'");
     SettingDBController().UpdateLocationIdOfDisplayCity("2-226396_1_AL");
     SettingPtr read = SettingDBController().Select();
     ASSERT_TRUE(read);
     EXPECT_EQ("2-226396_1_AL", read->GetCurrentCityLocationId());
-    EXPECT_EQ("WeatherNews", read->GetCpType());
+    EXPECT_EQ("Kweather", read->GetCpType());
 }
 
-TEST_F(SettingDBControllerTest, ReadingWithoutDatabaseGivesNullAndCreatesNothing)
+TEST_F(SettingDBControllerTest, MissingDatabaseIsNeitherReadNorCreated)
 {
+    EXPECT_EQ(ERR_FAIL, SettingDBController().Initialize());
+    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetSettingDBFilePath(), false) == false")) << mLog.Dump();
     MakeDBDir();
     EXPECT_FALSE(SettingDBController().Select());
     EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetSettingDBFilePath(), true) == false")) << mLog.Dump();
     EXPECT_FALSE(SettingsTest::FileExists(SettingDBPath()));
 }
 
-TEST_F(SettingDBControllerTest, InitializeFailsWithoutDatabaseFolder)
-{
-    EXPECT_EQ(ERR_FAIL, SettingDBController().Initialize());
-    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetSettingDBFilePath(), false) == false"))
-        << mLog.Dump();
-}
-
-// Each child reads the row, waits for its turn, changes one field and
-// writes the whole row back.
-void RunWriter(int readyFd, int goFd, void (*change)(Setting&))
-{
-    SettingPtr settingPtr = SettingDBController().Select();
-    char byte = settingPtr ? 'r' : 'x';
-    if (write(readyFd, &byte, 1) != 1 || read(goFd, &byte, 1) != 1 || !settingPtr)
-        _exit(2);
-    change(*settingPtr);
-    SettingDBController().Update(settingPtr);
-    _exit(0);
-}
-
+// A child process that reads the row, waits for its turn, changes it with
+// `change` and writes the whole row back.
 struct Writer
 {
     pid_t pid = -1;
     int ready[2] = {-1, -1};
     int go[2] = {-1, -1};
+
+    void Start(void (*change)(Setting&))
+    {
+        ASSERT_EQ(0, pipe(ready));
+        ASSERT_EQ(0, pipe(go));
+        pid = fork();
+        ASSERT_GE(pid, 0);
+        if (pid == 0)
+        {
+            SettingPtr settingPtr = SettingDBController().Select();
+            char byte = 'r';
+            if (!settingPtr || write(ready[1], &byte, 1) != 1 || read(go[0], &byte, 1) != 1)
+                _exit(2);
+            change(*settingPtr);
+            SettingDBController().Update(settingPtr);
+            _exit(0);
+        }
+        char byte = 0;
+        ASSERT_EQ(1, read(ready[0], &byte, 1));
+    }
+
+    int Finish()
+    {
+        char byte = 'g';
+        int status = -1;
+        bool ok = write(go[1], &byte, 1) == 1 && waitpid(pid, &status, 0) == pid;
+        for (int fd : {ready[0], ready[1], go[0], go[1]})
+            close(fd);
+        return ok && WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+    }
 };
-
-void StartWriter(Writer& writer, void (*change)(Setting&))
-{
-    ASSERT_EQ(0, pipe(writer.ready));
-    ASSERT_EQ(0, pipe(writer.go));
-    writer.pid = fork();
-    ASSERT_GE(writer.pid, 0);
-    if (writer.pid == 0)
-        RunWriter(writer.ready[1], writer.go[0], change);
-    char byte = 0;
-    ASSERT_EQ(1, read(writer.ready[0], &byte, 1));
-    ASSERT_EQ('r', byte);
-}
-
-int LetWriterFinish(Writer& writer)
-{
-    char byte = 'g';
-    int status = -1;
-    if (write(writer.go[1], &byte, 1) != 1 || waitpid(writer.pid, &status, 0) != writer.pid)
-        return -1;
-    for (int fd : {writer.ready[0], writer.ready[1], writer.go[0], writer.go[1]})
-        close(fd);
-    return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
-}
 
 TEST_F(SettingDBControllerTest, LaterWriterOfTwoProcessesWinsEveryColumn)
 {
     InitializeSettings();
     Writer first;
     Writer second;
-    StartWriter(first, [](Setting& s) {
+    first.Start([](Setting& s) {
         s.SetTemperatureUnit(0);
         s.SetCpType("Kweather");
     });
-    StartWriter(second, [](Setting& s) { s.SetCpType("cmaweather"); });
-    EXPECT_EQ(0, LetWriterFinish(first));
+    second.Start([](Setting& s) { s.SetCpType("cmaweather"); });
+    EXPECT_EQ(0, first.Finish());
     EXPECT_EQ("Kweather", SettingDBController().Select()->GetCpType());
-    EXPECT_EQ(0, LetWriterFinish(second));
+    EXPECT_EQ(0, second.Finish());
 
+    // The second read the row before the first wrote: the unit change is gone.
     SettingPtr read = SettingDBController().Select();
     ASSERT_TRUE(read);
     EXPECT_EQ("cmaweather", read->GetCpType());
-    // The second process read the row before the first wrote, so the
-    // first one's unit change is gone.
     EXPECT_EQ(1, read->GetTemperatureUnit());
     EXPECT_EQ(1, RawDB(SettingDBPath()).QueryInt("SELECT COUNT(*) FROM SETTING_TABLE"));
 }
