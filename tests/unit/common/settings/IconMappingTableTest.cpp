@@ -40,22 +40,49 @@ protected:
     void TearDown() override { unsetenv("PLATFORM_APP_ID"); }
 };
 
-TEST_F(IconMappingTableTest, AccuWeatherDaemonTypeChoosesTheTable)
+struct MappingCase
 {
-    UseProvider("Accuweather", "RI_DAEMON");
-    EXPECT_EQ(8, Map(16, true));
-    EXPECT_EQ(10, Map(20, true));
-    EXPECT_EQ(18, Map(34, false));
-    EXPECT_EQ(1, Map(34, true));
+    const char* cpType;
+    const char* daemonType;
+    int iconNum;
+    bool isDayTime;
+    int expected;
+};
 
-    for (const char* other : {"OTHER_DAEMON", "", "ri_daemon"})
+// Table values, both AccuWeather tables where they differ, the day/night
+// twins and the first number past each table.
+const MappingCase MAPPING_CASES[] = {
+    {"Accuweather", "RI_DAEMON", 16, true, 8},     {"Accuweather", "OTHER_DAEMON", 16, true, 9},
+    {"Accuweather", "RI_DAEMON", 20, false, 10},   {"Accuweather", "", 20, false, 11},
+    {"Accuweather", "RI_DAEMON", 34, false, 18},   {"Accuweather", "ri_daemon", 34, false, 19},
+    {"Accuweather", "RI_DAEMON", 34, true, 1},     {"Accuweather", "OTHER_DAEMON", 34, true, 2},
+    {"Accuweather", "RI_DAEMON", 1, false, 18},    {"Accuweather", "RI_DAEMON", 33, true, 1},
+    {"Accuweather", "RI_DAEMON", 35, false, 19},   {"Accuweather", "RI_DAEMON", 3, true, 2},
+    {"Accuweather", "RI_DAEMON", 22, false, 12},   {"Accuweather", "RI_DAEMON", 9, true, 0},
+    {"Accuweather", "RI_DAEMON", 44, true, 12},    {"Accuweather", "RI_DAEMON", 45, true, 0},
+    {"Accuweather", "RI_DAEMON", -1, false, 0},    {"cmaweather", "RI_DAEMON", 0, false, 18},
+    {"cmaweather", "RI_DAEMON", 0, true, 1},       {"cmaweather", "RI_DAEMON", 5, true, 20},
+    {"cmaweather", "RI_DAEMON", 31, true, 22},     {"cmaweather", "RI_DAEMON", 32, true, 0},
+    {"cmaweather", "RI_DAEMON", 53, true, 5},      {"cmaweather", "RI_DAEMON", 54, true, 0},
+    {"cmaweather", "RI_DAEMON", -1, true, 0},      {"Kweather", "RI_DAEMON", 1, false, 18},
+    {"Kweather", "RI_DAEMON", 39, true, 8},        {"Kweather", "RI_DAEMON", 40, true, 5},
+    {"Kweather", "RI_DAEMON", 41, true, 0},        {"Kweather", "RI_DAEMON", -1, false, 0},
+    {"weathernews_kr", "RI_DAEMON", 2, true, 2},   {"weathernews_kr", "RI_DAEMON", 2, false, 19},
+    {"weathernews_kr", "RI_DAEMON", 41, true, 0},  {"weathernews_kr", "RI_DAEMON", -1, true, 0},
+};
+
+TEST_F(IconMappingTableTest, FixedTablesByProvider)
+{
+    for (const MappingCase& c : MAPPING_CASES)
     {
-        UseProvider("Accuweather", other);
-        EXPECT_EQ(9, Map(16, true)) << other;
-        EXPECT_EQ(11, Map(20, true)) << other;
-        EXPECT_EQ(19, Map(34, false)) << other;
-        EXPECT_EQ(2, Map(34, true)) << other;
+        UseProvider(c.cpType, c.daemonType);
+        EXPECT_EQ(c.expected, Map(c.iconNum, c.isDayTime))
+            << c.cpType << "/" << c.daemonType << " " << c.iconNum << (c.isDayTime ? " day" : " night");
     }
+    // Each number past a table is reported once, in its provider's words.
+    EXPECT_EQ(2, mLog.Count("(iconNum >= ACCUWEATHER_ICON_ID_MAX || iconNum < 0) [return]")) << mLog.Dump();
+    EXPECT_EQ(2, mLog.Count("(iconNum >= CMAWEATHER_ICON_ID_MAX || iconNum < 0) [return]")) << mLog.Dump();
+    EXPECT_EQ(4, mLog.Count("(iconNum >= KWEATHER_ICON_ID_MAX || iconNum < 0) [return]")) << mLog.Dump();
 }
 
 TEST_F(IconMappingTableTest, AccuWeatherTablesAgreeAwayFromTheThreeNumbers)
@@ -78,63 +105,6 @@ TEST_F(IconMappingTableTest, AccuWeatherTablesAgreeAwayFromTheThreeNumbers)
             EXPECT_NE(riNight[n], otherNight[n]) << n;
         else
             EXPECT_TRUE(riDay[n] == otherDay[n] && riNight[n] == otherNight[n]) << n;
-    }
-}
-
-TEST_F(IconMappingTableTest, DayAndNightTwins)
-{
-    UseProvider("Accuweather");
-    EXPECT_EQ(1, Map(1, true));
-    EXPECT_EQ(18, Map(1, false));
-    EXPECT_EQ(1, Map(33, true));
-    EXPECT_EQ(18, Map(33, false));
-    EXPECT_EQ(19, Map(35, false));
-    EXPECT_EQ(2, Map(35, true));
-    EXPECT_EQ(2, Map(3, true));
-    EXPECT_EQ(19, Map(3, false));
-    // Numbers without a twin are the same by day and night.
-    EXPECT_EQ(12, Map(22, false));
-    EXPECT_EQ(0, Map(9, false));
-}
-
-TEST_F(IconMappingTableTest, AccuWeatherBounds)
-{
-    UseProvider("Accuweather");
-    EXPECT_EQ(12, Map(44, true));
-    EXPECT_EQ(0, Map(45, true));
-    EXPECT_EQ(0, Map(-1, false));
-    EXPECT_EQ(2, mLog.Count("(iconNum >= ACCUWEATHER_ICON_ID_MAX || iconNum < 0) [return]")) << mLog.Dump();
-}
-
-TEST_F(IconMappingTableTest, CmaWeatherTableAndBounds)
-{
-    UseProvider("cmaweather");
-    EXPECT_EQ(18, Map(0, false));
-    EXPECT_EQ(1, Map(0, true));
-    EXPECT_EQ(20, Map(5, true));
-    EXPECT_EQ(22, Map(31, true));
-    EXPECT_EQ(0, Map(32, true));
-    EXPECT_EQ(0, Map(52, true));
-    EXPECT_EQ(5, Map(53, true));
-    EXPECT_FALSE(mLog.Contains("CMAWEATHER_ICON_ID_MAX"));
-    EXPECT_EQ(0, Map(54, true));
-    EXPECT_EQ(0, Map(-1, true));
-    EXPECT_EQ(2, mLog.Count("(iconNum >= CMAWEATHER_ICON_ID_MAX || iconNum < 0) [return]")) << mLog.Dump();
-}
-
-TEST_F(IconMappingTableTest, KWeatherTableServesBothKoreanProviders)
-{
-    for (const char* cpType : {"Kweather", "weathernews_kr"})
-    {
-        UseProvider(cpType);
-        mLog.Clear();
-        EXPECT_EQ(18, Map(1, false)) << cpType;
-        EXPECT_EQ(2, Map(2, true)) << cpType;
-        EXPECT_EQ(8, Map(39, true)) << cpType;
-        EXPECT_EQ(5, Map(40, true)) << cpType;
-        EXPECT_EQ(0, Map(41, true)) << cpType;
-        EXPECT_EQ(0, Map(-1, false)) << cpType;
-        EXPECT_EQ(2, mLog.Count("(iconNum >= KWEATHER_ICON_ID_MAX || iconNum < 0) [return]")) << mLog.Dump();
     }
 }
 
