@@ -84,6 +84,34 @@ struct StatementFinalizer
 {
     void operator()(sqlite3_stmt* stmt) const { sqlite3_finalize(stmt); }
 };
+
+// The widget icon for one provider number from the icon database; 0 when
+// the number is not listed or the file has no usable table.
+int SelectMappedIcon(sqlite3* handle, int iconId, bool isDayTime)
+{
+    char query[ICON_QUERY_BUFFER_SIZE] = {};
+    snprintf(query, sizeof(query),
+             isDayTime ? "SELECT day_mapping_id FROM icon_table WHERE icon_id = %d;"
+                       : "SELECT night_mapping_id FROM icon_table WHERE icon_id = %d;",
+             iconId);
+    sqlite3_stmt* rawStmt = nullptr;
+    int rc = sqlite3_prepare_v2(handle, query, -1, &rawStmt, nullptr);
+    std::unique_ptr<sqlite3_stmt, StatementFinalizer> stmt(rawStmt);
+    if (rc != SQLITE_OK)
+    {
+        COMMON_LOG("Fail: sqlite3_prepare_v2 Failed rc [%d][%s]", rc, sqlite3_errmsg(handle));
+        COMMON_LOG("Query: %s", query);
+        return 0;
+    }
+    rc = sqlite3_step(stmt.get());
+    if (rc != SQLITE_ROW)
+    {
+        COMMON_LOG("No result : %d", rc);
+        return 0;
+    }
+    return sqlite3_column_int(stmt.get(), 0);
+}
+
 // The current-location city used to be stored under the provider's bare
 // key; it now carries ":C" so that it never collides with the same city
 // added by hand.
@@ -155,30 +183,7 @@ int DBController::GetWeatherNewsIcon(int iconId, bool isDayTime)
         COMMON_LOG("sqlite3_open_open failed. %d %p", rc, static_cast<void*>(rawHandle));
         return 0;
     }
-
-    char query[ICON_QUERY_BUFFER_SIZE] = {};
-    snprintf(query, sizeof(query),
-             isDayTime ? "SELECT day_mapping_id FROM icon_table WHERE icon_id = %d;"
-                       : "SELECT night_mapping_id FROM icon_table WHERE icon_id = %d;",
-             iconId);
-
-    sqlite3_stmt* rawStmt = nullptr;
-    rc = sqlite3_prepare_v2(handle.get(), query, -1, &rawStmt, nullptr);
-    std::unique_ptr<sqlite3_stmt, StatementFinalizer> stmt(rawStmt);
-    if (rc != SQLITE_OK)
-    {
-        COMMON_LOG("Fail: sqlite3_prepare_v2 Failed rc [%d][%s]", rc, sqlite3_errmsg(handle.get()));
-        COMMON_LOG("Query: %s", query);
-        return 0;
-    }
-
-    rc = sqlite3_step(stmt.get());
-    if (rc != SQLITE_ROW)
-    {
-        COMMON_LOG("No result : %d", rc);
-        return 0;
-    }
-    return sqlite3_column_int(stmt.get(), 0);
+    return SelectMappedIcon(handle.get(), iconId, isDayTime);
 }
 
 }  // namespace NSWeather
