@@ -146,7 +146,6 @@ Evas_Object* LayoutSample::CreateLoading(Evas_Object* parent)
     if (!loading)
         return nullptr;
     elm_object_part_text_set(loading, "message", Tr("IDS_DB_POP_LOADING_ING"));
-    elm_object_signal_emit(loading, "load", "");
     return loading;
 }
 
