@@ -218,6 +218,8 @@ void AppEventDispatcher::ApplyLanguage(const std::string& locale)
         return;
     }
     setenv("LANGUAGE", list.c_str(), 1);
+    // Setting a locale category is what makes gettext drop its cached catalogues.
+    setlocale(LC_MESSAGES, "");
     elm_language_set(list.c_str());
 }
 

@@ -3,6 +3,7 @@
 #include <cerrno>
 #include <climits>
 #include <cstdlib>
+#include <map>
 #include <sstream>
 
 #include "dlog.h"
@@ -92,32 +93,25 @@ std::string ControlCommandHandler::Result(const std::string& what, int code)
 
 void ControlCommandHandler::Handle(const std::string& line, const ReplyCb& reply)
 {
+    using Command = std::string (ControlCommandHandler::*)(const Words&);
+    static const std::map<std::string, Command> kCommands = {
+        {"create", &ControlCommandHandler::Create},    {"resize", &ControlCommandHandler::Lifecycle},
+        {"pause", &ControlCommandHandler::Lifecycle},  {"resume", &ControlCommandHandler::Lifecycle},
+        {"destroy", &ControlCommandHandler::Lifecycle}, {"update", &ControlCommandHandler::Update},
+        {"list", &ControlCommandHandler::List},        {"tap", &ControlCommandHandler::Tap},
+        {"swipe", &ControlCommandHandler::Swipe},      {"snapshot", &ControlCommandHandler::Snapshot},
+        {"dump", &ControlCommandHandler::Dump},        {"event", &ControlCommandHandler::Event},
+        {"exit", &ControlCommandHandler::Exit},
+    };
     Words words = Split(line);
     const std::string command = words.empty() ? std::string() : words[0];
     try
     {
-        if (command == "create")
-            reply(Create(words));
-        else if (command == "resize" || command == "pause" || command == "resume" || command == "destroy")
-            reply(Lifecycle(words));
-        else if (command == "update")
-            reply(Update(words));
-        else if (command == "list")
-            reply(List());
-        else if (command == "tap")
-            reply(Tap(words));
-        else if (command == "swipe")
-            reply(Swipe(words));
-        else if (command == "snapshot")
-            reply(Snapshot(words));
-        else if (command == "dump")
-            reply(Dump(words));
-        else if (command == "event")
-            reply(Event(words));
-        else if (command == "idle")
+        auto found = kCommands.find(command);
+        if (command == "idle")
             Idle(words, reply);
-        else if (command == "exit")
-            reply(mHost.Exit() == 0 ? "OK" : "ERR not running");
+        else if (found != kCommands.end())
+            reply((this->*found->second)(words));
         else
             reply("ERR unknown command \"" + Flatten(command) + "\"");
     }
@@ -167,7 +161,12 @@ std::string ControlCommandHandler::Update(const Words& words)
     return Result("update", mHost.UpdateInstance(words[1], nullptr, force != 0));
 }
 
-std::string ControlCommandHandler::List()
+std::string ControlCommandHandler::Exit(const Words&)
+{
+    return mHost.Exit() == 0 ? "OK" : "ERR not running";
+}
+
+std::string ControlCommandHandler::List(const Words&)
 {
     auto instances = mHost.GetInstances();
     std::string reply = "OK " + std::to_string(instances.size());

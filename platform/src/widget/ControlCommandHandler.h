@@ -41,7 +41,8 @@ private:
     std::string Create(const Words& words);
     std::string Lifecycle(const Words& words);
     std::string Update(const Words& words);
-    std::string List();
+    std::string List(const Words& words);
+    std::string Exit(const Words& words);
     std::string Tap(const Words& words);
     std::string Swipe(const Words& words);
     std::string Snapshot(const Words& words);
