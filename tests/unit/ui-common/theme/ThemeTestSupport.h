@@ -3,65 +3,54 @@
 
 #include <Ecore.h>
 #include <Edje.h>
+#include <unistd.h>
 
+#include <array>
 #include <fstream>
 #include <functional>
-#include <ostream>
 #include <string>
-#include <unistd.h>
 
 #include <uxt_theme.h>
 
 namespace ThemeTest
 {
+// r, g, b, a of a colour class; all -1 when the class is unset.
+typedef std::array<int, 4> Rgba;
+const Rgba UNSET{-1, -1, -1, -1};
+// The two themes of TwoThemeColorTable differ in every colour.
+const Rgba THEME1_ACCENT{0x10, 0x20, 0x30, 0xFF};
+const Rgba THEME2_ACCENT{0xA0, 0xB0, 0xC0, 0xD0};
+
+inline Rgba GetClassColor(const std::string& name)
+{
+    Rgba c;
+    int o[8];
+    if (!edje_color_class_get(name.c_str(), &c[0], &c[1], &c[2], &c[3], &o[0], &o[1], &o[2], &o[3], &o[4],
+                              &o[5], &o[6], &o[7]))
+        return UNSET;
+    return c;
+}
 
 inline void WriteText(const std::string& path, const std::string& text)
 {
     std::ofstream(path, std::ios::binary) << text;
 }
 
-// Runs the main loop until `done` holds or `seconds` pass.
-inline bool RunLoopUntil(const std::function<bool()>& done, double seconds = 3.0)
+// Runs the main loop until `done` holds or three seconds pass.
+inline bool RunLoopUntil(const std::function<bool()>& done)
 {
-    double end = ecore_time_get() + seconds;
-    while (!done())
+    for (double end = ecore_time_get() + 3.0; !done(); usleep(2000))
     {
         if (ecore_time_get() > end)
             return false;
         ecore_main_loop_iterate();
-        usleep(2000);
     }
     return true;
 }
 
-struct ClassColor
-{
-    int r = -1, g = -1, b = -1, a = -1;
-    bool operator==(const ClassColor& o) const { return r == o.r && g == o.g && b == o.b && a == o.a; }
-    bool operator!=(const ClassColor& o) const { return !(*this == o); }
-};
-
-inline std::ostream& operator<<(std::ostream& out, const ClassColor& c)
-{
-    return out << "(" << c.r << ", " << c.g << ", " << c.b << ", " << c.a << ")";
-}
-
-// The normal colour of a process-wide colour class; all -1 when unset.
-inline ClassColor GetClassColor(const std::string& name)
-{
-    ClassColor c;
-    int ignored[8];
-    if (!edje_color_class_get(name.c_str(), &c.r, &c.g, &c.b, &c.a, &ignored[0], &ignored[1], &ignored[2],
-                              &ignored[3], &ignored[4], &ignored[5], &ignored[6], &ignored[7]))
-        return ClassColor();
-    return c;
-}
-
-// Two themes that differ in every colour, so a re-application is visible.
 inline std::string TwoThemeColorTable()
 {
-    return "<?xml version=\"1.0\"?>\n"
-           "<ChangeableColorTable>\n"
+    return "<?xml version=\"1.0\"?>\n<ChangeableColorTable>\n"
            "  <Theme id=\"1\" style=\"light\">\n"
            "    <Color code=\"AO803E1\" normal=\"#102030FF\" pressed=\"#11223344\"/>\n"
            "    <Color code=\"W1511\" normal=\"#FFFFFF\"/>\n"
@@ -69,15 +58,20 @@ inline std::string TwoThemeColorTable()
            "  <Theme id=\"2\" style=\"dark\">\n"
            "    <Color code=\"AO803E1\" normal=\"#A0B0C0D0\"/>\n"
            "    <Color code=\"W1511\" normal=\"#000000\"/>\n"
-           "  </Theme>\n"
-           "</ChangeableColorTable>\n";
+           "  </Theme>\n</ChangeableColorTable>\n";
 }
 
 inline std::string OneFontTable()
 {
-    return "<ChangeableFontTable>\n"
-           "  <Font code=\"T1511\" name=\"Sans:style=Bold\" size=\"40\"/>\n"
-           "</ChangeableFontTable>\n";
+    return "<ChangeableFontTable><Font code=\"T1511\" name=\"Sans:style=Bold\" "
+           "size=\"40\"/></ChangeableFontTable>";
+}
+
+inline bool HasFontClass(const char* code)
+{
+    const char* font = nullptr;
+    Evas_Font_Size size = 0;
+    return edje_text_class_get(code, &font, &size);
 }
 
 // Leaves the process-wide theme as a fresh process has it.
