@@ -28,7 +28,8 @@ Result Guarded(Result onFailure, Call call)
 
 extern "C" int uxt_theme_set_changeable_ui_enabled(bool enabled)
 {
-    return ThemeState::GetInstance().SetEnabled(enabled);
+    return Guarded<int>(UXT_THEME_ERROR_OUT_OF_MEMORY,
+                        [&] { return ThemeState::GetInstance().SetEnabled(enabled); });
 }
 
 extern "C" bool uxt_theme_get_changeable_ui_enabled(void)
