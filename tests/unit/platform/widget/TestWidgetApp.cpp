@@ -43,6 +43,12 @@ void Record(const char* format, ...)
     fclose(file);
 }
 
+const char* Env(const char* name)
+{
+    const char* value = getenv(name);
+    return value ? value : "-";
+}
+
 std::string IdOf(widget_context_h context)
 {
     const char* id = widget_app_get_id(context);
@@ -222,8 +228,7 @@ void LanguageCb(app_event_info_h info, void*)
 {
     char* language = nullptr;
     app_event_get_language(info, &language);
-    const char* env = getenv("LANGUAGE");
-    Record("event language %s LANGUAGE=%s", language ? language : "-", env ? env : "-");
+    Record("event language %s LANGUAGE=%s", language ? language : "-", Env("LANGUAGE"));
     free(language);
     bundle* content = bundle_create();
     bundle_add_str(content, "reason", "language");
@@ -235,7 +240,7 @@ void RegionCb(app_event_info_h info, void*)
 {
     char* region = nullptr;
     app_event_get_region_format(info, &region);
-    Record("event region %s", region ? region : "-");
+    Record("event region %s LC_TIME=%s", region ? region : "-", Env("LC_TIME"));
     free(region);
 }
 
@@ -278,6 +283,7 @@ void LowMemoryCb(app_event_info_h info, void*)
 widget_class_h AppCreateCb(void*)
 {
     Record("app-create");
+    Record("env LANG=%s LANGUAGE=%s LC_TIME=%s", Env("LANG"), Env("LANGUAGE"), Env("LC_TIME"));
     app_event_handler_h handler = nullptr;
     widget_app_add_event_handler(&handler, APP_EVENT_LANGUAGE_CHANGED, LanguageCb, nullptr);
     widget_app_add_event_handler(&handler, APP_EVENT_REGION_FORMAT_CHANGED, RegionCb, nullptr);
