@@ -52,8 +52,9 @@ function(weather_add_test name)
   add_executable(${name} ${ARG_SOURCES})
   weather_apply_flags(${name})
   target_link_libraries(${name} PRIVATE ${ARG_LIBS} weather-test-support GTest::gmock GTest::gtest_main)
-  gtest_discover_tests(${name} DISCOVERY_TIMEOUT 60
-    PROPERTIES ENVIRONMENT "ECORE_NO_SYSTEM_MODULES=1;EINA_LOG_BACKTRACE=0;EINA_LOG_LEVELS=ecore_con:0;WEATHER_BUILD_DIR=${CMAKE_BINARY_DIR}")
+  # The quiet-EFL variables and the build folder come from the test support
+  # library (TestPlatform.cpp), not from CTest properties.
+  gtest_discover_tests(${name} DISCOVERY_TIMEOUT 60)
 endfunction()
 
 # weather_add_folder_test(name LIBS ...): one test binary of every .cpp in

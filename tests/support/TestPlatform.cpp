@@ -147,7 +147,21 @@ std::string LogCapture::Dump() const
 std::string BuildDir()
 {
     const char* dir = getenv("WEATHER_BUILD_DIR");
-    return dir ? dir : ".";
+    return dir && *dir ? dir : WEATHER_BUILD_DIR;
 }
+
+namespace
+{
+// EFL stays quiet and off D-Bus in every test program, however it is run.
+struct QuietEfl
+{
+    QuietEfl()
+    {
+        setenv("ECORE_NO_SYSTEM_MODULES", "1", 0);
+        setenv("EINA_LOG_BACKTRACE", "0", 0);
+        setenv("EINA_LOG_LEVELS", "ecore_con:0", 0);
+    }
+} gQuietEfl;
+}  // namespace
 
 }  // namespace WeatherTest

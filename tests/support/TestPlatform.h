@@ -79,7 +79,8 @@ protected:
     LogCapture mLog;
 };
 
-// Root of the build tree (WEATHER_BUILD_DIR, set by CTest).
+// Root of the build tree: WEATHER_BUILD_DIR from the environment, else the
+// folder this build was configured in.
 std::string BuildDir();
 
 }  // namespace WeatherTest
