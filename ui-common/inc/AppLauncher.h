@@ -30,7 +30,8 @@ public:
 
     int RequestRefreshToAgent();
     int RequestWeatherInfoWithLocationIdToAgent(const std::string& locationId);
-    int RequestWeatherInfoWithLocationIdForAddToAgent(const std::string& portName, const std::string& locationId);
+    int RequestWeatherInfoWithLocationIdForAddToAgent(const std::string& portName,
+                                                      const std::string& locationId);
     int RequestWeatherInfoWithCurrentLocationIdForAddToAgent(const std::string& portName,
                                                              const std::string& locationId);
     int RequestCurrentLocationWeatherInfoForSimpleAddProcessToAgent(const std::string& portName);
@@ -70,7 +71,8 @@ private:
                     void* userData = nullptr);
     int SendToAgent(const ExtraDataList& extraData);
 
-    static void ReplyCB(app_control_h request, app_control_h reply, app_control_result_e result, void* userData);
+    static void ReplyCB(app_control_h request, app_control_h reply, app_control_result_e result,
+                        void* userData);
 
     app_control_h mAppControl;
     AppLauncherReplyListener* mReplyListener;

@@ -20,13 +20,9 @@ const int DETAIL_ENTER_ACCUWEATHER = 10;
 
 }  // namespace
 
-AppLauncher::AppLauncher() : mAppControl(nullptr), mReplyListener(nullptr)
-{
-}
+AppLauncher::AppLauncher() : mAppControl(nullptr), mReplyListener(nullptr) {}
 
-AppLauncher::~AppLauncher()
-{
-}
+AppLauncher::~AppLauncher() {}
 
 void AppLauncher::AppControlCreate()
 {
@@ -116,8 +112,7 @@ int AppLauncher::SendRequest(const std::string& appId, const std::string& operat
             AppControlSetOperation(operation);
         if (!uri.empty())
             AppControlSetUrl(uri);
-        for (const auto& item : extraData)
-            AppControlAddExtraData(item.first, item.second);
+        for (const auto& item : extraData) AppControlAddExtraData(item.first, item.second);
         AppControlSendLaunchRequest(callback, userData);
         result = 0;
     }
@@ -204,8 +199,9 @@ int AppLauncher::RequestLaunchingBrowserWithUrl(const std::string& url)
 {
     UI_COMMON_LOG("RequestLaunchingBrowserWithUrl : %s", url.c_str());
     if (url.find(ACCUWEATHER_DOMAIN) != std::string::npos)
-        QuorvexLogManager::GetInstance()->CollectLogByFeature(
-            FEATURE_ENTER_PROVIDER_SITE, DETAIL_ENTER_ACCUWEATHER, QuorvexLogManager::URI_TYPE_FEATURE_SURVEY, -1);
+        QuorvexLogManager::GetInstance()->CollectLogByFeature(FEATURE_ENTER_PROVIDER_SITE,
+                                                              DETAIL_ENTER_ACCUWEATHER,
+                                                              QuorvexLogManager::URI_TYPE_FEATURE_SURVEY, -1);
     return SendRequest(std::string(), APP_CONTROL_OPERATION_VIEW, url, {});
 }
 
@@ -221,8 +217,8 @@ int AppLauncher::LaunchGPSSetting()
     // when someone waits for the reply.
     app_control_reply_cb callback = mReplyListener ? &AppLauncher::ReplyCB : nullptr;
     void* userData = mReplyListener ? this : nullptr;
-    return SendRequest(APP_CONTROL_LOCATION_SETTING_APP_ID, APP_CONTROL_OPERATION_SETTING_LOCATION, std::string(),
-                       {}, callback, userData);
+    return SendRequest(APP_CONTROL_LOCATION_SETTING_APP_ID, APP_CONTROL_OPERATION_SETTING_LOCATION,
+                       std::string(), {}, callback, userData);
 }
 
 void AppLauncher::ReplyCB(app_control_h request, app_control_h reply, app_control_result_e, void* userData)

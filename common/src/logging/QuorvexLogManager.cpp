@@ -53,9 +53,7 @@ QuorvexLogManager* QuorvexLogManager::GetInstance()
     return instance;
 }
 
-QuorvexLogManager::QuorvexLogManager() : mQuorvexLogManager(nullptr)
-{
-}
+QuorvexLogManager::QuorvexLogManager() : mQuorvexLogManager(nullptr) {}
 
 void QuorvexLogManager::Create()
 {
@@ -91,10 +89,13 @@ void QuorvexLogManager::CollectLogByFeature(int feature, int detailFeatureNumber
     int value = ClampValue(rawValue);
     do
     {
+        // The conditions are logged as written; keep their spelling.
+        // clang-format off
         COMMON_BREAK_IF(bundle_add_str(logData, "app_id", APP_ID) != BUNDLE_ERROR_NONE);
         COMMON_BREAK_IF(bundle_add_str(logData, "feature", featureStr.c_str())!= BUNDLE_ERROR_NONE);
         COMMON_BREAK_IF(bundle_add_str(logData, "extra", extraStr.c_str())!= BUNDLE_ERROR_NONE);
         COMMON_BREAK_IF(bundle_add_str(logData, "value", StringUtil::IntToString(value * 1000).c_str()) != BUNDLE_ERROR_NONE);
+        // clang-format on
         int requestId = quorvex_log_manager_insert(mQuorvexLogManager, uri.c_str(), logData,
                                                    &QuorvexLogManager::OnQuorvexLogManagerInsertCb, this);
         if (requestId < 0)
@@ -119,12 +120,12 @@ std::string QuorvexLogManager::GetUri(int uriType)
     const std::string base = std::string("content://") + QUORVEX_LOG_AUTHORITY;
     switch (uriType)
     {
-    case URI_TYPE_FEATURE_SURVEY:
-        return base + "/log/use_app_feature_survey";
-    case URI_TYPE_APP_STATUS_SURVEY:
-        return base + "/log/report_app_status_survey";
-    default:
-        return std::string();
+        case URI_TYPE_FEATURE_SURVEY:
+            return base + "/log/use_app_feature_survey";
+        case URI_TYPE_APP_STATUS_SURVEY:
+            return base + "/log/report_app_status_survey";
+        default:
+            return std::string();
     }
 }
 

@@ -23,7 +23,8 @@ bool IsSystemKey(const char* key)
     return strncmp(key, "__APP_SVC", 9) == 0 || strncmp(key, "__AUL_", 6) == 0;
 }
 
-int SetText(app_control_h handle, const char* text, bool app_control_s::*has, std::string app_control_s::*field)
+int SetText(app_control_h handle, const char* text, bool app_control_s::*has,
+            std::string app_control_s::*field)
 {
     if (!handle)
         return APP_CONTROL_ERROR_INVALID_PARAMETER;
@@ -65,8 +66,7 @@ bundle* AppControlToBundle(const app_control_s& request, const std::string& call
     AddIfSet(b, request.hasUri, kUriKey, request.uri);
     AddIfSet(b, request.hasAppId, kAppIdKey, request.appId);
     AddIfSet(b, !caller.empty(), kCallerKey, caller);
-    for (const auto& item : request.extra.items)
-        bundle_add_str(b, item->key.c_str(), item->value.c_str());
+    for (const auto& item : request.extra.items) bundle_add_str(b, item->key.c_str(), item->value.c_str());
     return b;
 }
 
@@ -172,8 +172,7 @@ extern "C" int app_control_foreach_extra_data(app_control_h appControl, app_cont
     if (!appControl || !callback)
         return APP_CONTROL_ERROR_INVALID_PARAMETER;
     std::vector<std::string> keys;
-    for (const auto& item : appControl->extra.items)
-        keys.push_back(item->key);
+    for (const auto& item : appControl->extra.items) keys.push_back(item->key);
     for (const std::string& key : keys)
         if (!callback(appControl, key.c_str(), userData))
             break;
@@ -188,7 +187,8 @@ extern "C" int app_control_get_launch_request(app_control_h* appControl)
     const char* encoded = getenv(APP_CONTROL_LAUNCH_REQUEST_ENV);
     if (!encoded || !*encoded)
         return APP_CONTROL_ERROR_KEY_NOT_FOUND;
-    bundle* b = bundle_decode(reinterpret_cast<const bundle_raw*>(encoded), static_cast<int>(strlen(encoded)));
+    bundle* b =
+        bundle_decode(reinterpret_cast<const bundle_raw*>(encoded), static_cast<int>(strlen(encoded)));
     auto request = std::make_unique<app_control_s>();
     bool ok = b && platform::AppControlFromBundle(b, *request);
     if (b)

@@ -24,8 +24,8 @@ using platform::kAppControlLogTag;
 
 std::vector<std::string> LaunchEnvironment(const std::string& appId, const std::string& encoded)
 {
-    const std::string overridden[] = {"PLATFORM_ROOT=", "PLATFORM_APP_ID=",
-                                      std::string(APP_CONTROL_LAUNCH_REQUEST_ENV) + "="};
+    const std::string overridden[] = {
+        "PLATFORM_ROOT=", "PLATFORM_APP_ID=", std::string(APP_CONTROL_LAUNCH_REQUEST_ENV) + "="};
     std::vector<std::string> env;
     for (char** item = environ; item && *item; ++item)
     {
@@ -63,8 +63,7 @@ bool WaitForExec(pid_t child, int readFd)
 {
     int error = 0;
     ssize_t n;
-    do
-        n = read(readFd, &error, sizeof(error));
+    do n = read(readFd, &error, sizeof(error));
     while (n < 0 && errno == EINTR);
     int status = 0;
     while (waitpid(child, &status, 0) < 0 && errno == EINTR)
@@ -84,7 +83,8 @@ void AppendLaunchLog(const platform::AppEntry& entry, const app_control_s& reque
                        ",\"extra\":" + platform::BundleToJson(&request.extra) + "}\n";
     int fd = -1;
     if (platform::MakeDirs(platform::RootPath("log")))
-        fd = open(platform::RootPath("log/launch.log").c_str(), O_WRONLY | O_CREAT | O_APPEND | O_CLOEXEC, 0644);
+        fd = open(platform::RootPath("log/launch.log").c_str(), O_WRONLY | O_CREAT | O_APPEND | O_CLOEXEC,
+                  0644);
     // One write, so that lines of several processes never interleave.
     if (fd < 0 || write(fd, line.data(), line.size()) != static_cast<ssize_t>(line.size()))
         dlog_print(DLOG_ERROR, kAppControlLogTag, "cannot write the launch log (errno %d)", errno);
@@ -101,15 +101,16 @@ int ResolveTarget(const app_control_s& request, platform::AppEntry& entry)
         dlog_print(DLOG_ERROR, kAppControlLogTag, "application %s is not registered", request.appId.c_str());
         return APP_CONTROL_ERROR_APP_NOT_FOUND;
     }
-    if (!request.hasOperation || request.operation.empty() || request.operation == APP_CONTROL_OPERATION_DEFAULT)
+    if (!request.hasOperation || request.operation.empty() ||
+        request.operation == APP_CONTROL_OPERATION_DEFAULT)
     {
         dlog_print(DLOG_ERROR, kAppControlLogTag, "launch request without application id or operation");
         return APP_CONTROL_ERROR_INVALID_PARAMETER;
     }
     if (platform::FindHandler(request, entry))
         return APP_CONTROL_ERROR_NONE;
-    dlog_print(DLOG_ERROR, kAppControlLogTag, "no application handles %s (uri \"%s\")", request.operation.c_str(),
-               request.uri.c_str());
+    dlog_print(DLOG_ERROR, kAppControlLogTag, "no application handles %s (uri \"%s\")",
+               request.operation.c_str(), request.uri.c_str());
     return APP_CONTROL_ERROR_APP_NOT_FOUND;
 }
 
@@ -124,8 +125,7 @@ int SpawnApp(const AppEntry& entry, const std::string& encodedRequest)
         return APP_CONTROL_ERROR_LAUNCH_FAILED;
     std::vector<std::string> env = LaunchEnvironment(entry.appId, encodedRequest);
     std::vector<char*> envp;
-    for (std::string& item : env)
-        envp.push_back(&item[0]);
+    for (std::string& item : env) envp.push_back(&item[0]);
     envp.push_back(nullptr);
     std::string program = entry.exec;
     char* argv[] = {&program[0], nullptr};

@@ -52,8 +52,7 @@ void ParseLine(const std::string& line, platform::AppEntry& entry)
     if (key == "exec")
         entry.exec = value;
     else if (key == "view-uri")
-        for (const std::string& scheme : SplitList(value))
-            entry.viewSchemes.push_back(Lower(scheme));
+        for (const std::string& scheme : SplitList(value)) entry.viewSchemes.push_back(Lower(scheme));
     else if (key == "operation")
         entry.operations = SplitList(value);
 }
@@ -101,8 +100,7 @@ bool LoadAppEntry(const std::string& appId, AppEntry& entry)
     entry.appId = appId;
     std::stringstream stream(content);
     std::string line;
-    while (std::getline(stream, line))
-        ParseLine(Trim(line), entry);
+    while (std::getline(stream, line)) ParseLine(Trim(line), entry);
     return !entry.exec.empty();
 }
 
@@ -117,7 +115,8 @@ bool FindHandler(const app_control_s& request, AppEntry& entry)
         AppEntry candidate;
         if (!LoadAppEntry(id, candidate))
             continue;
-        if ((view && Contains(candidate.viewSchemes, scheme)) || Contains(candidate.operations, request.operation))
+        if ((view && Contains(candidate.viewSchemes, scheme)) ||
+            Contains(candidate.operations, request.operation))
         {
             entry = candidate;
             return true;

@@ -103,8 +103,7 @@ extern "C" bundle* bundle_dup(bundle* b)
     try
     {
         auto copy = std::make_unique<_bundle_t>();
-        for (const auto& item : b->items)
-            copy->items.push_back(std::make_unique<keyval_t>(*item));
+        for (const auto& item : b->items) copy->items.push_back(std::make_unique<keyval_t>(*item));
         Fail(BUNDLE_ERROR_NONE);
         return copy.release();
     }
@@ -133,7 +132,8 @@ extern "C" bundle* bundle_decode(const bundle_raw* raw, const int len)
 {
     std::string binary;
     bundle* b = nullptr;
-    if (raw && len > 0 && platform::Base64Decode(reinterpret_cast<const char*>(raw), static_cast<size_t>(len), binary))
+    if (raw && len > 0 &&
+        platform::Base64Decode(reinterpret_cast<const char*>(raw), static_cast<size_t>(len), binary))
         b = platform::BundleFromBinary(binary);
     if (!b)
     {
@@ -155,10 +155,8 @@ extern "C" void bundle_foreach(bundle* b, bundle_iterator_t iter, void* userData
     // A snapshot, so that a callback that edits the bundle cannot pull an
     // entry out from under the loop.
     _bundle_t snapshot;
-    for (const auto& item : b->items)
-        snapshot.items.push_back(std::make_unique<keyval_t>(*item));
-    for (const auto& item : snapshot.items)
-        iter(item->key.c_str(), item->type, item.get(), userData);
+    for (const auto& item : b->items) snapshot.items.push_back(std::make_unique<keyval_t>(*item));
+    for (const auto& item : snapshot.items) iter(item->key.c_str(), item->type, item.get(), userData);
     Fail(BUNDLE_ERROR_NONE);
 }
 
@@ -190,8 +188,7 @@ extern "C" void bundle_iterate(bundle* b, bundle_iterate_cb_t callback, void* cb
         return;
     }
     std::vector<keyval_t> snapshot;
-    for (const auto& item : b->items)
-        snapshot.push_back(*item);
+    for (const auto& item : b->items) snapshot.push_back(*item);
     for (const keyval_t& item : snapshot)
         if (item.type == BUNDLE_TYPE_STR)
             callback(item.key.c_str(), item.value.c_str(), cbData);

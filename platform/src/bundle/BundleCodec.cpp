@@ -14,8 +14,7 @@ const size_t kEntryHeader = 12;
 
 void PutU32(std::string& out, uint32_t value)
 {
-    for (int shift = 24; shift >= 0; shift -= 8)
-        out.push_back(static_cast<char>((value >> shift) & 0xFF));
+    for (int shift = 24; shift >= 0; shift -= 8) out.push_back(static_cast<char>((value >> shift) & 0xFF));
 }
 
 class Reader
@@ -28,8 +27,7 @@ public:
         if (Remaining() < 4)
             return false;
         value = 0;
-        for (int i = 0; i < 4; ++i)
-            value = (value << 8) | static_cast<unsigned char>(mData[mPos++]);
+        for (int i = 0; i < 4; ++i) value = (value << 8) | static_cast<unsigned char>(mData[mPos++]);
         return true;
     }
 

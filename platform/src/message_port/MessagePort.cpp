@@ -89,8 +89,8 @@ void Deliver(const LocalPortPtr& port, const std::string& datagram)
     platform::MessageEnvelope envelope;
     if (!platform::DecodeEnvelope(datagram, envelope))
     {
-        dlog_print(DLOG_ERROR, kLogTag, "dropped a malformed message of %zu bytes on port %s", datagram.size(),
-                   port->name.c_str());
+        dlog_print(DLOG_ERROR, kLogTag, "dropped a malformed message of %zu bytes on port %s",
+                   datagram.size(), port->name.c_str());
         return;
     }
     port->callback(port->id, envelope.senderAppId.c_str(),
@@ -198,9 +198,9 @@ int AddPort(const char* name, message_port_message_cb callback, void* userData)
         gPorts[port->id] = port;
     }
     ecore_init();
-    port->handler = ecore_main_fd_handler_add(port->fd, ECORE_FD_READ, PortReadableCb,
-                                              reinterpret_cast<void*>(static_cast<intptr_t>(port->id)), nullptr,
-                                              nullptr);
+    port->handler =
+        ecore_main_fd_handler_add(port->fd, ECORE_FD_READ, PortReadableCb,
+                                  reinterpret_cast<void*>(static_cast<intptr_t>(port->id)), nullptr, nullptr);
     if (!port->handler)
     {
         dlog_print(DLOG_ERROR, kLogTag, "cannot watch port %s", port->name.c_str());
@@ -216,16 +216,16 @@ int MapSendError(int error, const char* port)
     dlog_print(DLOG_ERROR, kLogTag, "sending to port %s failed (errno %d)", port, error);
     switch (error)
     {
-    case ENOENT:
-    case ECONNREFUSED:
-        return MESSAGE_PORT_ERROR_PORT_NOT_FOUND;
-    case EAGAIN:
-    case ENOBUFS:
-        return MESSAGE_PORT_ERROR_RESOURCE_UNAVAILABLE;
-    case EMSGSIZE:
-        return MESSAGE_PORT_ERROR_MAX_EXCEEDED;
-    default:
-        return MESSAGE_PORT_ERROR_IO_ERROR;
+        case ENOENT:
+        case ECONNREFUSED:
+            return MESSAGE_PORT_ERROR_PORT_NOT_FOUND;
+        case EAGAIN:
+        case ENOBUFS:
+            return MESSAGE_PORT_ERROR_RESOURCE_UNAVAILABLE;
+        case EMSGSIZE:
+            return MESSAGE_PORT_ERROR_MAX_EXCEEDED;
+        default:
+            return MESSAGE_PORT_ERROR_IO_ERROR;
     }
 }
 

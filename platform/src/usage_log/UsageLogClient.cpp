@@ -36,7 +36,8 @@ bool AppendRecord(const std::string& line)
 {
     int fd = -1;
     if (platform::MakeDirs(platform::RootPath("log")))
-        fd = open(platform::RootPath("log/usage.log").c_str(), O_WRONLY | O_CREAT | O_APPEND | O_CLOEXEC, 0644);
+        fd = open(platform::RootPath("log/usage.log").c_str(), O_WRONLY | O_CREAT | O_APPEND | O_CLOEXEC,
+                  0644);
     bool ok = fd >= 0 && write(fd, line.data(), line.size()) == static_cast<ssize_t>(line.size());
     int error = errno;
     if (fd >= 0)
@@ -123,8 +124,9 @@ extern "C" int quorvex_log_manager_insert(quorvex_log_manager_h manager, const c
         return QUORVEX_LOG_MANAGER_ERROR_INVALID_PARAMETER;
     }
     int requestId = gNextRequestId++;
-    std::string line = "{\"request_id\":" + std::to_string(requestId) + ",\"uri\":" + platform::JsonQuote(uri) +
-                       ",\"data\":" + platform::BundleToJson(data) + "}\n";
+    std::string line = "{\"request_id\":" + std::to_string(requestId) +
+                       ",\"uri\":" + platform::JsonQuote(uri) + ",\"data\":" + platform::BundleToJson(data) +
+                       "}\n";
     if (!AppendRecord(line))
         return QUORVEX_LOG_MANAGER_ERROR_IO_ERROR;
     if (callback)

@@ -19,16 +19,16 @@ const char* ErrorName(int error)
 {
     switch (error)
     {
-    case MESSAGE_PORT_ERROR_PORT_NOT_FOUND:
-        return "port not found";
-    case MESSAGE_PORT_ERROR_INVALID_PARAMETER:
-        return "invalid parameter";
-    case MESSAGE_PORT_ERROR_MAX_EXCEEDED:
-        return "message too large";
-    case MESSAGE_PORT_ERROR_RESOURCE_UNAVAILABLE:
-        return "receiver busy";
-    default:
-        return "i/o error";
+        case MESSAGE_PORT_ERROR_PORT_NOT_FOUND:
+            return "port not found";
+        case MESSAGE_PORT_ERROR_INVALID_PARAMETER:
+            return "invalid parameter";
+        case MESSAGE_PORT_ERROR_MAX_EXCEEDED:
+            return "message too large";
+        case MESSAGE_PORT_ERROR_RESOURCE_UNAVAILABLE:
+            return "receiver busy";
+        default:
+            return "i/o error";
     }
 }
 

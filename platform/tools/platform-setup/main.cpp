@@ -38,27 +38,39 @@ void Usage()
 
 bool ParseOptions(int argc, char** argv, Options& options)
 {
-    static const option kOptions[] = {{"root", required_argument, nullptr, 'r'},
-                                      {"app", required_argument, nullptr, 'a'},
-                                      {"agent", required_argument, nullptr, 'g'},
-                                      {"widget", required_argument, nullptr, 'w'},
-                                      {"res", required_argument, nullptr, 's'},
-                                      {"browser", required_argument, nullptr, 'b'},
-                                      {"reset", no_argument, nullptr, 'x'},
-                                      {nullptr, 0, nullptr, 0}};
+    static const option kOptions[] = {
+        {"root", required_argument, nullptr, 'r'},  {"app", required_argument, nullptr, 'a'},
+        {"agent", required_argument, nullptr, 'g'}, {"widget", required_argument, nullptr, 'w'},
+        {"res", required_argument, nullptr, 's'},   {"browser", required_argument, nullptr, 'b'},
+        {"reset", no_argument, nullptr, 'x'},       {nullptr, 0, nullptr, 0}};
     int c;
     while ((c = getopt_long(argc, argv, "", kOptions, nullptr)) != -1)
     {
         switch (c)
         {
-        case 'r': setenv("PLATFORM_ROOT", optarg, 1); break;
-        case 'a': options.programs["com.quorvex.weather-m"] = optarg; break;
-        case 'g': options.programs["com.quorvex.weather-m-agent"] = optarg; break;
-        case 'w': options.programs["com.quorvex.weather-m-widget"] = optarg; break;
-        case 's': options.resDir = optarg; break;
-        case 'b': options.browser = optarg; break;
-        case 'x': options.reset = true; break;
-        default: return false;
+            case 'r':
+                setenv("PLATFORM_ROOT", optarg, 1);
+                break;
+            case 'a':
+                options.programs["com.quorvex.weather-m"] = optarg;
+                break;
+            case 'g':
+                options.programs["com.quorvex.weather-m-agent"] = optarg;
+                break;
+            case 'w':
+                options.programs["com.quorvex.weather-m-widget"] = optarg;
+                break;
+            case 's':
+                options.resDir = optarg;
+                break;
+            case 'b':
+                options.browser = optarg;
+                break;
+            case 'x':
+                options.reset = true;
+                break;
+            default:
+                return false;
         }
     }
     return optind == argc;
@@ -153,23 +165,30 @@ bool LinkResources(const std::string& appId, const std::string& resDir, const ch
 bool RegisterApp(const std::string& appId, const std::string& conf)
 {
     std::string dir = platform::AppDir(appId);
-    return platform::MakeDirs(dir + "/shared/data") && (conf.empty() || platform::WriteFileAtomic(dir + "/app.conf", conf));
+    return platform::MakeDirs(dir + "/shared/data") &&
+           (conf.empty() || platform::WriteFileAtomic(dir + "/app.conf", conf));
 }
 
 bool RegisterSuite(const Options& options)
 {
     bool ok = true;
-    for (const char* appId : {"com.quorvex.weather-m", "com.quorvex.weather-m-agent", "com.quorvex.weather-m-widget"})
+    for (const char* appId :
+         {"com.quorvex.weather-m", "com.quorvex.weather-m-agent", "com.quorvex.weather-m-widget"})
     {
         auto program = options.programs.find(appId);
-        std::string conf = program == options.programs.end() ? std::string() : "exec=" + Absolute(program->second) + "\n";
+        std::string conf =
+            program == options.programs.end() ? std::string() : "exec=" + Absolute(program->second) + "\n";
         ok = RegisterApp(appId, conf) && ok;
         ok = LinkResources(appId, options.resDir, "res") && ok;
         ok = LinkResources(appId, options.resDir, "shared/res") && ok;
     }
-    ok = RegisterApp(APP_CONTROL_BROWSER_APP_ID, "exec=" + Absolute(options.browser) + "\nview-uri=http,https\n") && ok;
-    ok = RegisterApp(APP_CONTROL_LOCATION_SETTING_APP_ID,
-                     std::string("exec=/bin/true\noperation=") + APP_CONTROL_OPERATION_SETTING_LOCATION + "\n") && ok;
+    ok = RegisterApp(APP_CONTROL_BROWSER_APP_ID,
+                     "exec=" + Absolute(options.browser) + "\nview-uri=http,https\n") &&
+         ok;
+    ok =
+        RegisterApp(APP_CONTROL_LOCATION_SETTING_APP_ID, std::string("exec=/bin/true\noperation=") +
+                                                             APP_CONTROL_OPERATION_SETTING_LOCATION + "\n") &&
+        ok;
     return ok;
 }
 

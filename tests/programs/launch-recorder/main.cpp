@@ -29,7 +29,8 @@ std::string Describe()
 {
     const char* root = getenv("PLATFORM_ROOT");
     const char* appId = getenv("PLATFORM_APP_ID");
-    std::string record = std::string("app_id=") + (appId ? appId : "") + "\nroot=" + (root ? root : "") + "\n";
+    std::string record =
+        std::string("app_id=") + (appId ? appId : "") + "\nroot=" + (root ? root : "") + "\n";
     app_control_h request = nullptr;
     int result = app_control_get_launch_request(&request);
     if (result != APP_CONTROL_ERROR_NONE)

@@ -56,8 +56,7 @@ protected:
         std::ifstream file(mRoot.Path("log/usage.log"));
         std::vector<Record> records;
         std::string line;
-        while (std::getline(file, line))
-            records.push_back(Parse(line));
+        while (std::getline(file, line)) records.push_back(Parse(line));
         return records;
     }
 
@@ -138,7 +137,8 @@ TEST_F(QuorvexLogManagerTest, CompletionIsLoggedOnTheMainLoop)
     EXPECT_FALSE(mLog.Contains("completed"));
     ecore_timer_add(
         0.05,
-        [](void*) -> Eina_Bool {
+        [](void*) -> Eina_Bool
+        {
             ecore_main_loop_quit();
             return ECORE_CALLBACK_CANCEL;
         },

@@ -32,8 +32,7 @@ std::vector<std::string> Lines(const std::string& text)
     std::vector<std::string> lines;
     std::stringstream stream(text);
     std::string line;
-    while (std::getline(stream, line))
-        lines.push_back(line);
+    while (std::getline(stream, line)) lines.push_back(line);
     return lines;
 }
 
@@ -47,7 +46,8 @@ bool RunLoopUntil(const std::function<bool()>& done, double seconds)
     } state{&done};
     Ecore_Timer* poll = ecore_timer_add(
         0.02,
-        [](void* data) -> Eina_Bool {
+        [](void* data) -> Eina_Bool
+        {
             auto* s = static_cast<State*>(data);
             if ((*s->done)())
             {
@@ -59,7 +59,8 @@ bool RunLoopUntil(const std::function<bool()>& done, double seconds)
         &state);
     Ecore_Timer* timeout = ecore_timer_add(
         seconds,
-        [](void*) -> Eina_Bool {
+        [](void*) -> Eina_Bool
+        {
             ecore_main_loop_quit();
             return ECORE_CALLBACK_CANCEL;
         },
@@ -125,17 +126,22 @@ TEST_F(AppControlTest, LaunchedProgramReceivesTheRequestInOrder)
 
     ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(mRequest, nullptr, nullptr));
 
-    std::vector<std::string> expected = {"app_id=test.recorder", "root=" + mRoot.GetPath(), "operation=(unset)",
-                                         "uri=file:///tmp/x", "extra:PORT_ID=some.port", "extra:MESSAGE=REFRESH",
+    std::vector<std::string> expected = {"app_id=test.recorder",
+                                         "root=" + mRoot.GetPath(),
+                                         "operation=(unset)",
+                                         "uri=file:///tmp/x",
+                                         "extra:PORT_ID=some.port",
+                                         "extra:MESSAGE=REFRESH",
                                          "extra:locationId=cityA, \"1\""};
     EXPECT_EQ(expected, WaitForRecord());
 
     std::vector<std::string> log = LaunchLog();
     ASSERT_EQ(1u, log.size());
     std::string tail = log[0].substr(log[0].find("\"app_id\""));
-    EXPECT_EQ("\"app_id\":\"test.recorder\",\"operation\":\"\",\"uri\":\"file:///tmp/x\",\"extra\":"
-              "{\"PORT_ID\":\"some.port\",\"MESSAGE\":\"REFRESH\",\"locationId\":\"cityA, \\\"1\\\"\"}}",
-              tail);
+    EXPECT_EQ(
+        "\"app_id\":\"test.recorder\",\"operation\":\"\",\"uri\":\"file:///tmp/x\",\"extra\":"
+        "{\"PORT_ID\":\"some.port\",\"MESSAGE\":\"REFRESH\",\"locationId\":\"cityA, \\\"1\\\"\"}}",
+        tail);
 }
 
 TEST_F(AppControlTest, ViewGoesToTheRegisteredBrowser)
@@ -160,7 +166,8 @@ TEST_F(AppControlTest, ViewGoesToTheRegisteredBrowser)
 
 TEST_F(AppControlTest, OperationHandlerIsFoundWithoutAppId)
 {
-    Register("test.location", "exec=" LAUNCH_RECORDER_PATH "\noperation=" APP_CONTROL_OPERATION_SETTING_LOCATION "\n");
+    Register("test.location",
+             "exec=" LAUNCH_RECORDER_PATH "\noperation=" APP_CONTROL_OPERATION_SETTING_LOCATION "\n");
     app_control_set_operation(mRequest, APP_CONTROL_OPERATION_SETTING_LOCATION);
     ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(mRequest, nullptr, nullptr));
     EXPECT_EQ("app_id=test.location", WaitForRecord("test.location").at(0));
@@ -196,10 +203,13 @@ TEST_F(AppControlTest, UnknownOrBrokenTargetsFailWithTheirCodes)
 
 TEST_F(AppControlTest, RequestWithoutTargetIsRefused)
 {
-    EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_send_launch_request(mRequest, nullptr, nullptr));
+    EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER,
+              app_control_send_launch_request(mRequest, nullptr, nullptr));
     app_control_set_operation(mRequest, APP_CONTROL_OPERATION_DEFAULT);
-    EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_send_launch_request(mRequest, nullptr, nullptr));
-    EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_send_launch_request(nullptr, nullptr, nullptr));
+    EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER,
+              app_control_send_launch_request(mRequest, nullptr, nullptr));
+    EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER,
+              app_control_send_launch_request(nullptr, nullptr, nullptr));
 }
 
 TEST_F(AppControlTest, ExtraDataRules)
@@ -208,7 +218,8 @@ TEST_F(AppControlTest, ExtraDataRules)
     EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_add_extra_data(mRequest, "k", ""));
     EXPECT_EQ(APP_CONTROL_ERROR_INVALID_PARAMETER, app_control_add_extra_data(mRequest, "k", nullptr));
     EXPECT_EQ(APP_CONTROL_ERROR_KEY_REJECTED, app_control_add_extra_data(mRequest, "__APP_SVC_PKG__", "x"));
-    EXPECT_EQ(APP_CONTROL_ERROR_KEY_REJECTED, app_control_add_extra_data(mRequest, "__AUL_CALLER_APPID__", "x"));
+    EXPECT_EQ(APP_CONTROL_ERROR_KEY_REJECTED,
+              app_control_add_extra_data(mRequest, "__AUL_CALLER_APPID__", "x"));
     char* value = nullptr;
     EXPECT_EQ(APP_CONTROL_ERROR_KEY_NOT_FOUND, app_control_get_extra_data(mRequest, "k", &value));
     ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_add_extra_data(mRequest, "k", "v"));

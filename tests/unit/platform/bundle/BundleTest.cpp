@@ -59,14 +59,19 @@ std::string Encode(bundle* b)
 
 BundlePtr Decode(const std::string& text)
 {
-    return BundlePtr(bundle_decode(reinterpret_cast<const bundle_raw*>(text.data()), static_cast<int>(text.size())));
+    return BundlePtr(
+        bundle_decode(reinterpret_cast<const bundle_raw*>(text.data()), static_cast<int>(text.size())));
 }
 
 // Hand-made binary encodings, to produce inputs the encoder never would.
 struct Binary
 {
     std::string data;
-    Binary& Raw(const std::string& bytes) { data += bytes; return *this; }
+    Binary& Raw(const std::string& bytes)
+    {
+        data += bytes;
+        return *this;
+    }
     Binary& U32(uint32_t value)
     {
         for (int shift = 24; shift >= 0; shift -= 8)
@@ -74,8 +79,16 @@ struct Binary
         return *this;
     }
     Binary& Text(const std::string& text) { return U32(static_cast<uint32_t>(text.size())).Raw(text); }
-    Binary& Entry(const std::string& key, const std::string& value) { return U32(BUNDLE_TYPE_STR).Text(key).Text(value); }
-    static Binary Header(uint32_t count) { Binary b; b.Raw("QBND").Raw(std::string(1, '\x01')).U32(count); return b; }
+    Binary& Entry(const std::string& key, const std::string& value)
+    {
+        return U32(BUNDLE_TYPE_STR).Text(key).Text(value);
+    }
+    static Binary Header(uint32_t count)
+    {
+        Binary b;
+        b.Raw("QBND").Raw(std::string(1, '\x01')).U32(count);
+        return b;
+    }
     std::string Base64() const { return platform::Base64Encode(data); }
 };
 
@@ -114,12 +127,15 @@ TEST_F(BundleTest, DuplicateIsIndependent)
 
 TEST_F(BundleTest, EncodingRoundTripsEveryValue)
 {
-    Pairs pairs = {{"MESSAGE", "REQUEST_ALL_WEATHER_INFO"}, {"empty", ""}, {"utf8", "Seoul 서울 °C"},
-                   {"quotes", "\"a\\b\"\n\t"}, {"long", std::string(5000, 'x')}};
+    Pairs pairs = {{"MESSAGE", "REQUEST_ALL_WEATHER_INFO"},
+                   {"empty", ""},
+                   {"utf8", "Seoul 서울 °C"},
+                   {"quotes", "\"a\\b\"\n\t"},
+                   {"long", std::string(5000, 'x')}};
     BundlePtr b = Make(pairs);
     std::string text = Encode(b.get());
-    EXPECT_EQ(std::string::npos, text.find_first_not_of(
-                                     "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/="));
+    EXPECT_EQ(std::string::npos,
+              text.find_first_not_of("ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/="));
     BundlePtr decoded = Decode(text);
     ASSERT_TRUE(decoded);
     EXPECT_EQ(pairs, Contents(decoded.get()));
@@ -166,8 +182,20 @@ TEST_F(BundleTest, DecodeRejectsMalformedEncodings)
     const std::vector<std::pair<const char*, std::string>> cases = {
         {"not base64", "!!!!"},
         {"whitespace", Binary::Header(0).Base64() + "\n"},
-        {"wrong magic", [] { Binary b; b.Raw("XBND").Raw(std::string(1, '\x01')).U32(0); return b.Base64(); }()},
-        {"wrong version", [] { Binary b; b.Raw("QBND").Raw(std::string(1, '\x02')).U32(0); return b.Base64(); }()},
+        {"wrong magic",
+         []
+         {
+             Binary b;
+             b.Raw("XBND").Raw(std::string(1, '\x01')).U32(0);
+             return b.Base64();
+         }()},
+        {"wrong version",
+         []
+         {
+             Binary b;
+             b.Raw("QBND").Raw(std::string(1, '\x02')).U32(0);
+             return b.Base64();
+         }()},
         {"count beyond data", Binary::Header(0xFFFFFFFF).Base64()},
         {"count larger than entries", Binary::Header(2).Entry("a", "1").Base64()},
         {"trailing bytes", Binary::Header(1).Entry("a", "1").Raw("x").Base64()},
@@ -201,7 +229,8 @@ TEST_F(BundleTest, IterateSkipsNothingAndSurvivesEdits)
     } context{b.get(), &seen};
     bundle_iterate(
         b.get(),
-        [](const char* key, const char* value, void* data) {
+        [](const char* key, const char* value, void* data)
+        {
             auto* ctx = static_cast<Context*>(data);
             ctx->seen->emplace_back(key, value);
             bundle_del(ctx->b, "b");

@@ -42,8 +42,11 @@ void CollectCb(const char* key, const char* value, void* data)
 
 void MessageCb(int portId, const char* remoteAppId, const char* remotePort, bool, bundle* message, void* data)
 {
-    Received received{portId, remoteAppId ? remoteAppId : "(null)", remotePort != nullptr,
-                      remotePort ? remotePort : "", {}};
+    Received received{portId,
+                      remoteAppId ? remoteAppId : "(null)",
+                      remotePort != nullptr,
+                      remotePort ? remotePort : "",
+                      {}};
     bundle_iterate(message, CollectCb, &received.message);
     static_cast<std::vector<Received>*>(data)->push_back(received);
 }
@@ -58,7 +61,8 @@ void RunLoop(const std::vector<Received>& received, size_t count, double seconds
     } state{&received, count};
     Ecore_Timer* poll = ecore_timer_add(
         0.01,
-        [](void* data) -> Eina_Bool {
+        [](void* data) -> Eina_Bool
+        {
             auto* s = static_cast<State*>(data);
             if (s->received->size() >= s->count)
                 ecore_main_loop_quit();
@@ -67,7 +71,8 @@ void RunLoop(const std::vector<Received>& received, size_t count, double seconds
         &state);
     Ecore_Timer* timeout = ecore_timer_add(
         seconds,
-        [](void*) -> Eina_Bool {
+        [](void*) -> Eina_Bool
+        {
             ecore_main_loop_quit();
             return ECORE_CALLBACK_RENEW;
         },
@@ -88,8 +93,7 @@ protected:
 
     void TearDown() override
     {
-        for (int id : mPortIds)
-            message_port_unregister_local_port(id);
+        for (int id : mPortIds) message_port_unregister_local_port(id);
         unsetenv("PLATFORM_APP_ID");
         ecore_shutdown();
     }
@@ -102,7 +106,10 @@ protected:
         return id;
     }
 
-    std::string SocketPath(const char* name) const { return mRoot.Path(std::string("run/msgport/") + name + ".sock"); }
+    std::string SocketPath(const char* name) const
+    {
+        return mRoot.Path(std::string("run/msgport/") + name + ".sock");
+    }
 
     // Writes raw bytes to the port's socket, as a broken sender would.
     void SendRaw(const char* name, const std::string& bytes) const
@@ -112,7 +119,8 @@ protected:
         strncpy(address.sun_path, SocketPath(name).c_str(), sizeof(address.sun_path) - 1);
         int fd = socket(AF_UNIX, SOCK_DGRAM, 0);
         ASSERT_EQ(static_cast<ssize_t>(bytes.size()),
-                  sendto(fd, bytes.data(), bytes.size(), 0, reinterpret_cast<sockaddr*>(&address), sizeof(address)));
+                  sendto(fd, bytes.data(), bytes.size(), 0, reinterpret_cast<sockaddr*>(&address),
+                         sizeof(address)));
         close(fd);
     }
 
@@ -129,11 +137,10 @@ TEST_F(MessagePortTest, MessageFromAnotherProcessReachesTheCallback)
     EXPECT_TRUE(S_ISSOCK(st.st_mode));
     EXPECT_EQ(0600u, st.st_mode & 0777);
 
-    std::vector<std::string> args = {MSGPORT_SEND_PATH, "com.quorvex.weather-m-widget", kPort,
-                                     "RESULT=done", "empty=", "text=a=b c"};
+    std::vector<std::string> args = {
+        MSGPORT_SEND_PATH, "com.quorvex.weather-m-widget", kPort, "RESULT=done", "empty=", "text=a=b c"};
     std::vector<char*> argv;
-    for (std::string& arg : args)
-        argv.push_back(&arg[0]);
+    for (std::string& arg : args) argv.push_back(&arg[0]);
     argv.push_back(nullptr);
     setenv("PLATFORM_APP_ID", "com.quorvex.weather-m-agent", 1);
     pid_t child = 0;
@@ -153,10 +160,10 @@ TEST_F(MessagePortTest, MessageFromAnotherProcessReachesTheCallback)
 
 TEST_F(MessagePortTest, ToolReportsMissingPortAndBadArguments)
 {
-    auto run = [](const std::vector<std::string>& args) {
+    auto run = [](const std::vector<std::string>& args)
+    {
         std::string command = MSGPORT_SEND_PATH;
-        for (const std::string& arg : args)
-            command += " '" + arg + "'";
+        for (const std::string& arg : args) command += " '" + arg + "'";
         command += " 2>/dev/null";
         int status = system(command.c_str());
         return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
@@ -175,7 +182,8 @@ TEST_F(MessagePortTest, SendWithLocalPortNamesTheSender)
     ASSERT_GT(local, 0);
     EXPECT_NE(receiver, local);
     bundle* message = bundle_create();
-    EXPECT_EQ(MESSAGE_PORT_ERROR_NONE, message_port_send_message_with_local_port("app", kPort, message, local));
+    EXPECT_EQ(MESSAGE_PORT_ERROR_NONE,
+              message_port_send_message_with_local_port("app", kPort, message, local));
     EXPECT_EQ(MESSAGE_PORT_ERROR_NONE, message_port_send_message("app", kPort, message));
     EXPECT_EQ(MESSAGE_PORT_ERROR_INVALID_PARAMETER,
               message_port_send_message_with_local_port("app", kPort, message, 9999));
@@ -242,9 +250,11 @@ TEST_F(MessagePortTest, RegistrationRules)
     EXPECT_EQ(1u, other.size());
     EXPECT_TRUE(mReceived.empty());
 
-    EXPECT_EQ(MESSAGE_PORT_ERROR_INVALID_PARAMETER, message_port_register_local_port(nullptr, MessageCb, nullptr));
+    EXPECT_EQ(MESSAGE_PORT_ERROR_INVALID_PARAMETER,
+              message_port_register_local_port(nullptr, MessageCb, nullptr));
     EXPECT_EQ(MESSAGE_PORT_ERROR_INVALID_PARAMETER, message_port_register_local_port("", MessageCb, nullptr));
-    EXPECT_EQ(MESSAGE_PORT_ERROR_INVALID_PARAMETER, message_port_register_local_port("a/b", MessageCb, nullptr));
+    EXPECT_EQ(MESSAGE_PORT_ERROR_INVALID_PARAMETER,
+              message_port_register_local_port("a/b", MessageCb, nullptr));
     EXPECT_EQ(MESSAGE_PORT_ERROR_INVALID_PARAMETER, message_port_register_local_port("p", nullptr, nullptr));
 
     EXPECT_EQ(MESSAGE_PORT_ERROR_NONE, message_port_unregister_local_port(id));
@@ -287,7 +297,8 @@ TEST_F(MessagePortTest, CallbackMayUnregisterItsPort)
     } context;
     context.id = message_port_register_local_port(
         kPort,
-        [](int, const char*, const char*, bool, bundle*, void* data) {
+        [](int, const char*, const char*, bool, bundle*, void* data)
+        {
             auto* ctx = static_cast<Context*>(data);
             ++ctx->calls;
             message_port_unregister_local_port(ctx->id);

@@ -38,7 +38,8 @@ protected:
     {
         char* path = nullptr;
         int ret = app_resource_manager_get(type, id, &path);
-        std::string result = ret == APP_RESOURCE_ERROR_NONE ? std::string(path) : "error " + std::to_string(ret);
+        std::string result =
+            ret == APP_RESOURCE_ERROR_NONE ? std::string(path) : "error " + std::to_string(ret);
         free(path);
         return result;
     }
@@ -53,7 +54,8 @@ TEST_F(AppResourceManagerTest, LayoutIdResolvesInTheOwnResourceFolder)
 
     // The device's resolution folder wins when it has the file.
     MakeFile(Res("720x1280/widget/WidgetView.edj"));
-    EXPECT_EQ(Res("720x1280/widget/WidgetView.edj"), Get(APP_RESOURCE_TYPE_LAYOUT, "edje/widget/WidgetView.edj"));
+    EXPECT_EQ(Res("720x1280/widget/WidgetView.edj"),
+              Get(APP_RESOURCE_TYPE_LAYOUT, "edje/widget/WidgetView.edj"));
 
     MakeFile(Res("icon.png"));
     EXPECT_EQ(Res("icon.png"), Get(APP_RESOURCE_TYPE_IMAGE, "images/icon.png"));
@@ -66,7 +68,8 @@ TEST_F(AppResourceManagerTest, MissingFileIsAnIoError)
     EXPECT_TRUE(mLog.Contains("no file for resource \"edje/widget/Missing.edj\"", "RESOURCE_MANAGER"));
     // A folder of that name is no file either.
     ASSERT_EQ(0, system(("mkdir -p '" + Res("widget/Dir.edj") + "'").c_str()));
-    EXPECT_EQ("error " + std::to_string(APP_RESOURCE_ERROR_IO_ERROR), Get(APP_RESOURCE_TYPE_LAYOUT, "edje/widget/Dir.edj"));
+    EXPECT_EQ("error " + std::to_string(APP_RESOURCE_ERROR_IO_ERROR),
+              Get(APP_RESOURCE_TYPE_LAYOUT, "edje/widget/Dir.edj"));
 }
 
 TEST_F(AppResourceManagerTest, UnsafeOrInvalidRequestsAreRefused)
@@ -85,7 +88,8 @@ TEST_F(AppResourceManagerTest, UnsafeOrInvalidRequestsAreRefused)
 TEST_F(AppResourceManagerTest, ProcessWithoutApplicationIdHasNoResources)
 {
     unsetenv("PLATFORM_APP_ID");
-    EXPECT_EQ("error " + std::to_string(APP_RESOURCE_ERROR_IO_ERROR), Get(APP_RESOURCE_TYPE_LAYOUT, "edje/a.edj"));
+    EXPECT_EQ("error " + std::to_string(APP_RESOURCE_ERROR_IO_ERROR),
+              Get(APP_RESOURCE_TYPE_LAYOUT, "edje/a.edj"));
     EXPECT_TRUE(mLog.Contains("no resource folder", "RESOURCE_MANAGER"));
 }
 

@@ -29,7 +29,8 @@ void Spin(double seconds)
 {
     ecore_timer_add(
         seconds,
-        [](void*) -> Eina_Bool {
+        [](void*) -> Eina_Bool
+        {
             ecore_main_loop_quit();
             return ECORE_CALLBACK_CANCEL;
         },
@@ -60,8 +61,7 @@ protected:
         std::ifstream file(mRoot.Path("log/usage.log"));
         std::vector<std::string> lines;
         std::string line;
-        while (std::getline(file, line))
-            lines.push_back(line);
+        while (std::getline(file, line)) lines.push_back(line);
         return lines;
     }
 

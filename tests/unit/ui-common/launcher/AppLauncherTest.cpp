@@ -31,7 +31,8 @@ struct Launch
 
     bool operator==(const Launch& other) const
     {
-        return appId == other.appId && operation == other.operation && uri == other.uri && extra == other.extra;
+        return appId == other.appId && operation == other.operation && uri == other.uri &&
+               extra == other.extra;
     }
 };
 
@@ -78,8 +79,8 @@ protected:
         std::vector<Launch> launches;
         std::string line;
         while (std::getline(file, line))
-            launches.push_back({Field(line, "app_id", '"'), Field(line, "operation", '"'), Field(line, "uri", '"'),
-                                Field(line, "extra", '}')});
+            launches.push_back({Field(line, "app_id", '"'), Field(line, "operation", '"'),
+                                Field(line, "uri", '"'), Field(line, "extra", '}')});
         return launches;
     }
 
@@ -104,15 +105,18 @@ TEST_F(AppLauncherTest, AgentRequestsCarryTheirCommandsInOrder)
         std::string extra;
     };
     const std::vector<Case> cases = {
-        {[](AppLauncher& l) { return l.RequestRefreshToAgent(); }, "{\"MESSAGE\":\"REQUEST_ALL_WEATHER_INFO\"}"},
+        {[](AppLauncher& l) { return l.RequestRefreshToAgent(); },
+         "{\"MESSAGE\":\"REQUEST_ALL_WEATHER_INFO\"}"},
         {[](AppLauncher& l) { return l.RequestWeatherInfoWithLocationIdToAgent("cityA"); },
          "{\"MESSAGE\":\"REQUEST_WEATHER_INFO_WITH_LOCATION_ID\",\"locationId\":\"cityA\"}"},
         {[](AppLauncher& l) { return l.RequestWeatherInfoWithLocationIdForAddToAgent(kPort, "cityB"); },
          std::string("{\"PORT_ID\":\"") + kPort +
              "\",\"MESSAGE\":\"REQUEST_WEATHER_INFO_WITH_LOCATION_ID_FOR_ADD\",\"locationId\":\"cityB\"}"},
-        {[](AppLauncher& l) { return l.RequestWeatherInfoWithCurrentLocationIdForAddToAgent(kPort, "cityC"); },
+        {[](AppLauncher& l)
+         { return l.RequestWeatherInfoWithCurrentLocationIdForAddToAgent(kPort, "cityC"); },
          std::string("{\"PORT_ID\":\"") + kPort +
-             "\",\"MESSAGE\":\"REQUEST_WEATHER_INFO_WITH_CURRENT_LOCATION_ID_FOR_ADD\",\"locationId\":\"cityC\"}"},
+             "\",\"MESSAGE\":\"REQUEST_WEATHER_INFO_WITH_CURRENT_LOCATION_ID_FOR_ADD\",\"locationId\":"
+             "\"cityC\"}"},
         {[](AppLauncher& l) { return l.RequestCurrentLocationWeatherInfoForSimpleAddProcessToAgent(kPort); },
          std::string("{\"PORT_ID\":\"") + kPort +
              "\",\"MESSAGE\":\"REQUEST_CURRENT_LOCATION_WEATHER_INFO_FOR_SIMPLE_ADD_PROCESS\"}"},
@@ -122,11 +126,11 @@ TEST_F(AppLauncherTest, AgentRequestsCarryTheirCommandsInOrder)
          "{\"MESSAGE\":\"SET_NOW_REFRESHING\",\"refreshing\":\"false\"}"},
         {[](AppLauncher& l) { return l.RequestSetLocationIdOfDisplayCityToAgent("cityD"); },
          "{\"MESSAGE\":\"SET_LOCATIONID_OF_DISPLAY_CITY\",\"locationId\":\"cityD\"}"},
-        {[](AppLauncher& l) { return l.RequestCancelAllRequest(); }, "{\"MESSAGE\":\"REQUEST_CANCEL_ALL_REQUEST\"}"},
+        {[](AppLauncher& l) { return l.RequestCancelAllRequest(); },
+         "{\"MESSAGE\":\"REQUEST_CANCEL_ALL_REQUEST\"}"},
     };
     // One launcher for all: every request builds and drops its own handle.
-    for (const Case& item : cases)
-        EXPECT_EQ(0, item.request(mLauncher)) << item.extra;
+    for (const Case& item : cases) EXPECT_EQ(0, item.request(mLauncher)) << item.extra;
     std::vector<Launch> launches = Launches();
     ASSERT_EQ(cases.size(), launches.size());
     for (size_t i = 0; i < cases.size(); ++i)
