@@ -73,13 +73,15 @@ typedef struct _uxt_theme_font_table *uxt_theme_font_table_h;
 typedef void (*uxt_theme_changed_cb)(void *user_data);
 
 /* Whether tables are applied to Edje at all; off at start. While off,
- * set_color_table/set_font_table give INVALID_OPERATION. */
+ * set_color_table/set_font_table give INVALID_OPERATION; switching off
+ * removes the applied classes, so layouts show their own colours again. */
 int uxt_theme_set_changeable_ui_enabled(bool enabled);
 bool uxt_theme_get_changeable_ui_enabled(void);
 
 /* Parses a table file. NULL on failure, with get_last_result():
  * INVALID_PARAMETER (no path), IO_ERROR (unreadable), NO_DATA (malformed
- * or no entry). The caller deletes the table. */
+ * or no entry). The caller deletes the table. A deleted or unknown
+ * handle gives INVALID_PARAMETER everywhere. Main loop only. */
 uxt_theme_color_table_h uxt_theme_add_color_table(const char *file_path);
 int uxt_theme_delete_color_table(uxt_theme_color_table_h table);
 /* Applies the table's colours and keeps it as the current colour table
