@@ -35,8 +35,7 @@ std::string BuildDir()
     char exe[4096] = {};
     ssize_t length = readlink("/proc/self/exe", exe, sizeof(exe) - 1);
     std::string path(exe, length > 0 ? static_cast<size_t>(length) : 0);
-    for (int i = 0; i < 2 && path.find('/') != std::string::npos; ++i)
-        path = path.substr(0, path.rfind('/'));
+    for (int i = 0; i < 2 && path.find('/') != std::string::npos; ++i) path = path.substr(0, path.rfind('/'));
     return path;
 }
 
@@ -118,16 +117,14 @@ void BM_GetMappingIconNumWeatherNews(benchmark::State& state)
 {
     Root().SetProvider("WeatherNews");
     NSWeather::IconMappingTable table;
-    for (auto _ : state)
-        benchmark::DoNotOptimize(table.GetMappingIconNum(101, false));
+    for (auto _ : state) benchmark::DoNotOptimize(table.GetMappingIconNum(101, false));
 }
 BENCHMARK(BM_GetMappingIconNumWeatherNews);
 
 void BM_GetContentProvider(benchmark::State& state)
 {
     Root().SetProvider("cmaweather");
-    for (auto _ : state)
-        benchmark::DoNotOptimize(NSWeather::ContentProvider::GetContentProvider());
+    for (auto _ : state) benchmark::DoNotOptimize(NSWeather::ContentProvider::GetContentProvider());
 }
 BENCHMARK(BM_GetContentProvider);
 

@@ -34,18 +34,25 @@ const UpgradeStep UPGRADE_STEPS[] = {
     {0.2, "UpgradeDBTables < 0.2", "ALTER TABLE HOURLY_WEATHER_TABLE ADD websiteUrl TEXT DEFAULT '';", false},
     {0.2, "UpgradeDBTables", "DROP TABLE VERSION_TABLE;", false},
     {0.3, "UpgradeDBTables < 0.3",
-     "ALTER TABLE EXTRA_WEATHER_TABLE ADD aqi INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD pm25 INTEGER;", false},
+     "ALTER TABLE EXTRA_WEATHER_TABLE ADD aqi INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD pm25 INTEGER;",
+     false},
     {0.4, "UpgradeDBTables < 0.4",
-     "ALTER TABLE EXTRA_WEATHER_TABLE ADD outdoorExcercise INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD comfort "
-     "INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD clothing INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD skincare "
+     "ALTER TABLE EXTRA_WEATHER_TABLE ADD outdoorExcercise INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD "
+     "comfort "
+     "INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD clothing INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD "
+     "skincare "
      "INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD carwash INTEGER;",
      false},
     {0.5, "UpgradeDBTables < 0.5", "ALTER TABLE CITY_TABLE ADD needToUpdate INTEGER;", false},
     {0.6, "UpgradeDBTables < 0.6",
-     "ALTER TABLE EXTRA_WEATHER_TABLE ADD foodPoison INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD heat INTEGER;ALTER "
-     "TABLE EXTRA_WEATHER_TABLE ADD spoiledFood INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD discomfort INTEGER;ALTER "
-     "TABLE EXTRA_WEATHER_TABLE ADD frozenPipes INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD frostbite INTEGER;ALTER "
-     "TABLE EXTRA_WEATHER_TABLE ADD cold INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD pollen INTEGER;ALTER TABLE "
+     "ALTER TABLE EXTRA_WEATHER_TABLE ADD foodPoison INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD heat "
+     "INTEGER;ALTER "
+     "TABLE EXTRA_WEATHER_TABLE ADD spoiledFood INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD discomfort "
+     "INTEGER;ALTER "
+     "TABLE EXTRA_WEATHER_TABLE ADD frozenPipes INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD frostbite "
+     "INTEGER;ALTER "
+     "TABLE EXTRA_WEATHER_TABLE ADD cold INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD pollen INTEGER;ALTER "
+     "TABLE "
      "EXTRA_WEATHER_TABLE ADD airDust INTEGER;ALTER TABLE EXTRA_WEATHER_TABLE ADD dryskin INTEGER;",
      false},
     {0.7, "UpgradeDBTables < 0.7", "ALTER TABLE CITY_TABLE ADD isSummerTime INTEGER;", true},
@@ -176,7 +183,8 @@ int DBController::GetWeatherNewsIcon(int iconId, bool isDayTime)
     // Shipped with the program: read-only, so a missing file is reported
     // instead of an empty database being created in the resource folder.
     sqlite3* rawHandle = nullptr;
-    int rc = sqlite3_open_v2(iconDBPath.c_str(), &rawHandle, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY, nullptr);
+    int rc = sqlite3_open_v2(iconDBPath.c_str(), &rawHandle, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY,
+                             nullptr);
     std::unique_ptr<sqlite3, SqliteCloser> handle(rawHandle);
     if (rc != SQLITE_OK)
     {

@@ -18,18 +18,25 @@ constexpr const char* SETTING_TABLE = "SETTING_TABLE";
 constexpr const char* SETTING_CREATE_FORMAT =
     "CREATE TABLE IF NOT EXISTS %s (CurrentCityIndex INT, CurrentCityLocationId TEXT,TemperatureUnit INT, "
     "LastRefreshedTime INT64, CurrentLocationAreaRefreshedTime INT64, IsFirstLaunch INT, AutoRefreshOn INT, "
-    "AutoRefreshInterval INT, UseCurrentLocationOn INT, ShowCurrentCityAgreement INT, RefreshOnOpeningOn INT, "
-    "RefreshOnOpeningOnAgreement INT, NotificationOn INT, NotificationTime INT64, NetworkPositionPopupAgreement "
+    "AutoRefreshInterval INT, UseCurrentLocationOn INT, ShowCurrentCityAgreement INT, RefreshOnOpeningOn "
+    "INT, "
+    "RefreshOnOpeningOnAgreement INT, NotificationOn INT, NotificationTime INT64, "
+    "NetworkPositionPopupAgreement "
     "INT, ShowNetworkPopup INT, ChinaDataGPSPerformPopupOn INT, AutoScrollOn INT, AutoScrollInterval INT, "
-    "LastUpdateLanguageCode TEXT, CpType TEXT, DaemonType TEXT, IsNowRefreshing INT, IsSupportManualRefresh INT, "
+    "LastUpdateLanguageCode TEXT, CpType TEXT, DaemonType TEXT, IsNowRefreshing INT, IsSupportManualRefresh "
+    "INT, "
     "RefreshingStartTime INT64);";
 
 constexpr const char* SETTING_COLUMNS =
     "CurrentCityIndex, CurrentCityLocationId, TemperatureUnit, LastRefreshedTime, "
-    "CurrentLocationAreaRefreshedTime, IsFirstLaunch, AutoRefreshOn, AutoRefreshInterval, UseCurrentLocationOn, "
-    "ShowCurrentCityAgreement, RefreshOnOpeningOn, RefreshOnOpeningOnAgreement, NotificationOn, NotificationTime, "
-    "NetworkPositionPopupAgreement, ShowNetworkPopup, ChinaDataGPSPerformPopupOn, AutoScrollOn, AutoScrollInterval, "
-    "LastUpdateLanguageCode, CpType, DaemonType, IsNowRefreshing, IsSupportManualRefresh, RefreshingStartTime";
+    "CurrentLocationAreaRefreshedTime, IsFirstLaunch, AutoRefreshOn, AutoRefreshInterval, "
+    "UseCurrentLocationOn, "
+    "ShowCurrentCityAgreement, RefreshOnOpeningOn, RefreshOnOpeningOnAgreement, NotificationOn, "
+    "NotificationTime, "
+    "NetworkPositionPopupAgreement, ShowNetworkPopup, ChinaDataGPSPerformPopupOn, AutoScrollOn, "
+    "AutoScrollInterval, "
+    "LastUpdateLanguageCode, CpType, DaemonType, IsNowRefreshing, IsSupportManualRefresh, "
+    "RefreshingStartTime";
 
 constexpr const char* SETTING_PLACEHOLDERS =
     "?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?";
@@ -39,7 +46,8 @@ constexpr const char* SETTING_ASSIGNMENTS =
     "CurrentLocationAreaRefreshedTime = ?, IsFirstLaunch = ?, AutoRefreshOn = ?, AutoRefreshInterval = ?, "
     "UseCurrentLocationOn = ?, ShowCurrentCityAgreement = ?, RefreshOnOpeningOn = ?, "
     "RefreshOnOpeningOnAgreement = ?, NotificationOn = ?, NotificationTime = ?, "
-    "NetworkPositionPopupAgreement = ?, ShowNetworkPopup = ?, ChinaDataGPSPerformPopupOn = ?, AutoScrollOn = ?, "
+    "NetworkPositionPopupAgreement = ?, ShowNetworkPopup = ?, ChinaDataGPSPerformPopupOn = ?, AutoScrollOn = "
+    "?, "
     "AutoScrollInterval = ?, LastUpdateLanguageCode = ?, CpType = ?, DaemonType = ?, IsNowRefreshing = ?, "
     "IsSupportManualRefresh = ?, RefreshingStartTime = ?";
 
@@ -95,7 +103,8 @@ void SettingDBController::CreateTable()
 void SettingDBController::Insert(const SettingPtr& settingPtr)
 {
     COMMON_RET_IF(!settingPtr);
-    DBStatement statement(mQueryGenernator.MakeInsertQuery(SETTING_TABLE, SETTING_COLUMNS, SETTING_PLACEHOLDERS));
+    DBStatement statement(
+        mQueryGenernator.MakeInsertQuery(SETTING_TABLE, SETTING_COLUMNS, SETTING_PLACEHOLDERS));
     BindSetting(statement, settingPtr);
     statement.Step();
 }
@@ -134,9 +143,7 @@ SettingPtr SettingDBController::Select()
     return settingPtr;
 }
 
-void SettingDBController::UpgradeDB(double /*currentVersion*/)
-{
-}
+void SettingDBController::UpgradeDB(double /*currentVersion*/) {}
 
 SettingPtr SettingDBController::SelectRow()
 {

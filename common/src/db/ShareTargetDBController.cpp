@@ -15,7 +15,8 @@ namespace
 {
 constexpr const char* SHARE_TARGET_TABLE = "SHARE_TARGET_TABLE";
 constexpr const char* SHARE_TARGET_CREATE_FORMAT =
-    "CREATE TABLE IF NOT EXISTS %s (PK_ID\tINTEGER NOT NULL PRIMARY KEY AUTOINCREMENT,AppID\tTEXT, PortID\tTEXT);";
+    "CREATE TABLE IF NOT EXISTS %s (PK_ID\tINTEGER NOT NULL PRIMARY KEY AUTOINCREMENT,AppID\tTEXT, "
+    "PortID\tTEXT);";
 constexpr const char* SHARE_TARGET_SELECT_COLUMNS = "AppID,PortID";
 constexpr const char* SHARE_TARGET_INSERT_COLUMNS = "AppID, PortID";
 constexpr const char* SHARE_TARGET_PLACEHOLDERS = "?, ?";
@@ -79,8 +80,8 @@ void ShareTargetDBController::Insert(const ShareTargetPtr& shareTargetPtr)
         return;
     }
     {
-        DBStatement statement(mQueryGenernator.MakeInsertQuery(SHARE_TARGET_TABLE, SHARE_TARGET_INSERT_COLUMNS,
-                                                                SHARE_TARGET_PLACEHOLDERS));
+        DBStatement statement(mQueryGenernator.MakeInsertQuery(
+            SHARE_TARGET_TABLE, SHARE_TARGET_INSERT_COLUMNS, SHARE_TARGET_PLACEHOLDERS));
         statement.BindText(1, shareTargetPtr->GetAppID());
         statement.BindText(2, shareTargetPtr->GetPortID());
         statement.Step();
@@ -97,9 +98,7 @@ ShareTargetPtrVectorPtr ShareTargetDBController::Select()
     return shareTargetPtrVector;
 }
 
-void ShareTargetDBController::UpgradeDB(double /*currentVersion*/)
-{
-}
+void ShareTargetDBController::UpgradeDB(double /*currentVersion*/) {}
 
 bool ShareTargetDBController::IsAppIdStored(const std::string& appId, int& stepResult)
 {

@@ -13,9 +13,7 @@
 namespace NSWeather
 {
 
-UpgradeDBController::UpgradeDBController() : mCurrentVersion(0.0), mLatestVersion(0.0)
-{
-}
+UpgradeDBController::UpgradeDBController() : mCurrentVersion(0.0), mLatestVersion(0.0) {}
 
 UpgradeDBController::~UpgradeDBController() = default;
 

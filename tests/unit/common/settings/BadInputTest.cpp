@@ -19,8 +19,7 @@ std::string RandomBytes(size_t size, unsigned seed)
 {
     std::mt19937 generator(seed);
     std::string bytes(size, '\0');
-    for (char& byte : bytes)
-        byte = static_cast<char>(generator() & 0xff);
+    for (char& byte : bytes) byte = static_cast<char>(generator() & 0xff);
     return bytes;
 }
 
@@ -60,15 +59,17 @@ TEST_F(BadInputTest, SettingTableOfAForeignSchemaIsReadAsAbsent)
     MakeDBDir();
     {
         RawDB db(SettingDBPath());
-        db.Exec("CREATE TABLE SETTING_TABLE (name TEXT, value TEXT);"
-                "INSERT INTO SETTING_TABLE VALUES ('CpType', 'WeatherNews');");
+        db.Exec(
+            "CREATE TABLE SETTING_TABLE (name TEXT, value TEXT);"
+            "INSERT INTO SETTING_TABLE VALUES ('CpType', 'WeatherNews');");
     }
     ExpectEmptyReadings();
     EXPECT_EQ(ERR_OK, SettingDBController().Initialize());
     SettingDBController().Update(std::make_shared<Setting>());
     ExpectEmptyReadings();
     RawDB db(SettingDBPath(), true);
-    EXPECT_EQ("CpType=WeatherNews", db.QueryText("SELECT group_concat(name || '=' || value) FROM SETTING_TABLE"));
+    EXPECT_EQ("CpType=WeatherNews",
+              db.QueryText("SELECT group_concat(name || '=' || value) FROM SETTING_TABLE"));
 }
 
 TEST_F(BadInputTest, EmptyForeignSettingTableTakesNoRowAndSaysSo)

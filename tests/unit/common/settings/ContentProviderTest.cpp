@@ -17,9 +17,11 @@ protected:
 TEST_F(ContentProviderTest, EachKnownTextGivesItsCode)
 {
     const std::pair<const char*, int> cases[] = {
-        {"Accuweather", CP_ACCUWEATHER}, {"cmaweather", CP_CMAWEATHER},   {"Kweather", CP_KWEATHER},
-        {"weathernews_kr", CP_WEATHERNEWS_KR}, {"WeatherNews", CP_WEATHERNEWS}, {"", CP_ACCUWEATHER},
-        {"kweather", CP_ACCUWEATHER},   {"Kweather ", CP_ACCUWEATHER},   {"WeatherNews_kr", CP_ACCUWEATHER},
+        {"Accuweather", CP_ACCUWEATHER},    {"cmaweather", CP_CMAWEATHER},
+        {"Kweather", CP_KWEATHER},          {"weathernews_kr", CP_WEATHERNEWS_KR},
+        {"WeatherNews", CP_WEATHERNEWS},    {"", CP_ACCUWEATHER},
+        {"kweather", CP_ACCUWEATHER},       {"Kweather ", CP_ACCUWEATHER},
+        {"WeatherNews_kr", CP_ACCUWEATHER},
     };
     for (const auto& c : cases)
     {

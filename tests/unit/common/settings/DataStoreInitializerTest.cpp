@@ -14,20 +14,25 @@ namespace
 constexpr const char* SETTING_FORMAT =
     "CREATE TABLE IF NOT EXISTS %s (CurrentCityIndex INT, CurrentCityLocationId TEXT,TemperatureUnit INT, "
     "LastRefreshedTime INT64, CurrentLocationAreaRefreshedTime INT64, IsFirstLaunch INT, AutoRefreshOn INT, "
-    "AutoRefreshInterval INT, UseCurrentLocationOn INT, ShowCurrentCityAgreement INT, RefreshOnOpeningOn INT, "
-    "RefreshOnOpeningOnAgreement INT, NotificationOn INT, NotificationTime INT64, NetworkPositionPopupAgreement "
+    "AutoRefreshInterval INT, UseCurrentLocationOn INT, ShowCurrentCityAgreement INT, RefreshOnOpeningOn "
+    "INT, "
+    "RefreshOnOpeningOnAgreement INT, NotificationOn INT, NotificationTime INT64, "
+    "NetworkPositionPopupAgreement "
     "INT, ShowNetworkPopup INT, ChinaDataGPSPerformPopupOn INT, AutoScrollOn INT, AutoScrollInterval INT, "
-    "LastUpdateLanguageCode TEXT, CpType TEXT, DaemonType TEXT, IsNowRefreshing INT, IsSupportManualRefresh INT, "
+    "LastUpdateLanguageCode TEXT, CpType TEXT, DaemonType TEXT, IsNowRefreshing INT, IsSupportManualRefresh "
+    "INT, "
     "RefreshingStartTime INT64);";
 constexpr const char* SHARE_TARGET_FORMAT =
-    "CREATE TABLE IF NOT EXISTS %s (PK_ID\tINTEGER NOT NULL PRIMARY KEY AUTOINCREMENT,AppID\tTEXT, PortID\tTEXT);";
+    "CREATE TABLE IF NOT EXISTS %s (PK_ID\tINTEGER NOT NULL PRIMARY KEY AUTOINCREMENT,AppID\tTEXT, "
+    "PortID\tTEXT);";
 constexpr const char* VERSION_FORMAT = "CREATE TABLE IF NOT EXISTS %s (dbVersion DOUBLE);";
 
 // User tables of a database file, without SQLite's own.
 std::vector<std::string> TableNames(RawDB& db)
 {
-    return db.QueryTexts("SELECT name FROM sqlite_master WHERE type = 'table' AND name NOT LIKE 'sqlite_%' "
-                         "ORDER BY name");
+    return db.QueryTexts(
+        "SELECT name FROM sqlite_master WHERE type = 'table' AND name NOT LIKE 'sqlite_%' "
+        "ORDER BY name");
 }
 
 class DataStoreInitializerTest : public SettingsTest::SettingsFixture
@@ -46,7 +51,8 @@ TEST_F(DataStoreInitializerTest, FreshRootGetsFourDatabasesWithTheirTables)
 
     RawDB setting(SettingDBPath(), true);
     EXPECT_EQ(std::vector<std::string>{"SETTING_TABLE"}, TableNames(setting));
-    EXPECT_EQ(SettingsTest::StoredCreateSql(SETTING_FORMAT, "SETTING_TABLE"), setting.TableSql("SETTING_TABLE"));
+    EXPECT_EQ(SettingsTest::StoredCreateSql(SETTING_FORMAT, "SETTING_TABLE"),
+              setting.TableSql("SETTING_TABLE"));
 
     RawDB shareTarget(ShareTargetDBPath(), true);
     EXPECT_EQ(SettingsTest::StoredCreateSql(SHARE_TARGET_FORMAT, "SHARE_TARGET_TABLE"),
@@ -55,7 +61,8 @@ TEST_F(DataStoreInitializerTest, FreshRootGetsFourDatabasesWithTheirTables)
 
     RawDB version(VersionDBPath(), true);
     EXPECT_EQ(std::vector<std::string>{"VERSION_TABLE"}, TableNames(version));
-    EXPECT_EQ(SettingsTest::StoredCreateSql(VERSION_FORMAT, "VERSION_TABLE"), version.TableSql("VERSION_TABLE"));
+    EXPECT_EQ(SettingsTest::StoredCreateSql(VERSION_FORMAT, "VERSION_TABLE"),
+              version.TableSql("VERSION_TABLE"));
 }
 
 TEST_F(DataStoreInitializerTest, FreshRootHasDefaultSettingsAndLatestVersion)

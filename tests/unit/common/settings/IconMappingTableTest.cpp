@@ -24,7 +24,10 @@ protected:
         SetSettingColumn("DaemonType", "'" + daemonType + "'");
     }
 
-    static int Map(int iconNum, bool isDayTime) { return IconMappingTable().GetMappingIconNum(iconNum, isDayTime); }
+    static int Map(int iconNum, bool isDayTime)
+    {
+        return IconMappingTable().GetMappingIconNum(iconNum, isDayTime);
+    }
 };
 
 // The widget's own resources: the icon database built with the program.
@@ -52,23 +55,23 @@ struct MappingCase
 // Table values, both AccuWeather tables where they differ, the day/night
 // twins and the first number past each table.
 const MappingCase MAPPING_CASES[] = {
-    {"Accuweather", "RI_DAEMON", 16, true, 8},     {"Accuweather", "OTHER_DAEMON", 16, true, 9},
-    {"Accuweather", "RI_DAEMON", 20, false, 10},   {"Accuweather", "", 20, false, 11},
-    {"Accuweather", "RI_DAEMON", 34, false, 18},   {"Accuweather", "ri_daemon", 34, false, 19},
-    {"Accuweather", "RI_DAEMON", 34, true, 1},     {"Accuweather", "OTHER_DAEMON", 34, true, 2},
-    {"Accuweather", "RI_DAEMON", 1, false, 18},    {"Accuweather", "RI_DAEMON", 33, true, 1},
-    {"Accuweather", "RI_DAEMON", 35, false, 19},   {"Accuweather", "RI_DAEMON", 3, true, 2},
-    {"Accuweather", "RI_DAEMON", 22, false, 12},   {"Accuweather", "RI_DAEMON", 9, true, 0},
-    {"Accuweather", "RI_DAEMON", 44, true, 12},    {"Accuweather", "RI_DAEMON", 45, true, 0},
-    {"Accuweather", "RI_DAEMON", -1, false, 0},    {"cmaweather", "RI_DAEMON", 0, false, 18},
-    {"cmaweather", "RI_DAEMON", 0, true, 1},       {"cmaweather", "RI_DAEMON", 5, true, 20},
-    {"cmaweather", "RI_DAEMON", 31, true, 22},     {"cmaweather", "RI_DAEMON", 32, true, 0},
-    {"cmaweather", "RI_DAEMON", 53, true, 5},      {"cmaweather", "RI_DAEMON", 54, true, 0},
-    {"cmaweather", "RI_DAEMON", -1, true, 0},      {"Kweather", "RI_DAEMON", 1, false, 18},
-    {"Kweather", "RI_DAEMON", 39, true, 8},        {"Kweather", "RI_DAEMON", 40, true, 5},
-    {"Kweather", "RI_DAEMON", 41, true, 0},        {"Kweather", "RI_DAEMON", -1, false, 0},
-    {"weathernews_kr", "RI_DAEMON", 2, true, 2},   {"weathernews_kr", "RI_DAEMON", 2, false, 19},
-    {"weathernews_kr", "RI_DAEMON", 41, true, 0},  {"weathernews_kr", "RI_DAEMON", -1, true, 0},
+    {"Accuweather", "RI_DAEMON", 16, true, 8},    {"Accuweather", "OTHER_DAEMON", 16, true, 9},
+    {"Accuweather", "RI_DAEMON", 20, false, 10},  {"Accuweather", "", 20, false, 11},
+    {"Accuweather", "RI_DAEMON", 34, false, 18},  {"Accuweather", "ri_daemon", 34, false, 19},
+    {"Accuweather", "RI_DAEMON", 34, true, 1},    {"Accuweather", "OTHER_DAEMON", 34, true, 2},
+    {"Accuweather", "RI_DAEMON", 1, false, 18},   {"Accuweather", "RI_DAEMON", 33, true, 1},
+    {"Accuweather", "RI_DAEMON", 35, false, 19},  {"Accuweather", "RI_DAEMON", 3, true, 2},
+    {"Accuweather", "RI_DAEMON", 22, false, 12},  {"Accuweather", "RI_DAEMON", 9, true, 0},
+    {"Accuweather", "RI_DAEMON", 44, true, 12},   {"Accuweather", "RI_DAEMON", 45, true, 0},
+    {"Accuweather", "RI_DAEMON", -1, false, 0},   {"cmaweather", "RI_DAEMON", 0, false, 18},
+    {"cmaweather", "RI_DAEMON", 0, true, 1},      {"cmaweather", "RI_DAEMON", 5, true, 20},
+    {"cmaweather", "RI_DAEMON", 31, true, 22},    {"cmaweather", "RI_DAEMON", 32, true, 0},
+    {"cmaweather", "RI_DAEMON", 53, true, 5},     {"cmaweather", "RI_DAEMON", 54, true, 0},
+    {"cmaweather", "RI_DAEMON", -1, true, 0},     {"Kweather", "RI_DAEMON", 1, false, 18},
+    {"Kweather", "RI_DAEMON", 39, true, 8},       {"Kweather", "RI_DAEMON", 40, true, 5},
+    {"Kweather", "RI_DAEMON", 41, true, 0},       {"Kweather", "RI_DAEMON", -1, false, 0},
+    {"weathernews_kr", "RI_DAEMON", 2, true, 2},  {"weathernews_kr", "RI_DAEMON", 2, false, 19},
+    {"weathernews_kr", "RI_DAEMON", 41, true, 0}, {"weathernews_kr", "RI_DAEMON", -1, true, 0},
 };
 
 TEST_F(IconMappingTableTest, FixedTablesByProvider)
@@ -87,7 +90,8 @@ TEST_F(IconMappingTableTest, FixedTablesByProvider)
 
 TEST_F(IconMappingTableTest, AccuWeatherTablesAgreeAwayFromTheThreeNumbers)
 {
-    auto mapAll = [](std::vector<int>& day, std::vector<int>& night) {
+    auto mapAll = [](std::vector<int>& day, std::vector<int>& night)
+    {
         for (int n = 0; n < 45; ++n)
         {
             day.push_back(Map(n, true));
@@ -145,7 +149,8 @@ TEST_F(WeatherNewsIconTest, MissingDatabaseIsReportedAndNotCreated)
     mkdir(mRoot.Path("apps/com.quorvex.weather-m-widget/res/data").c_str(), 0755);
     SettingsTest::WriteFileBytes(iconDB, "");
     EXPECT_EQ(0, Map(100, true));
-    EXPECT_TRUE(mLog.Contains("Fail: sqlite3_prepare_v2 Failed rc [1][no such table: icon_table]")) << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("Fail: sqlite3_prepare_v2 Failed rc [1][no such table: icon_table]"))
+        << mLog.Dump();
 }
 
 TEST_F(WeatherNewsIconTest, UnknownResourceFolderGivesNoIcon)
@@ -157,12 +162,14 @@ TEST_F(WeatherNewsIconTest, UnknownResourceFolderGivesNoIcon)
 
 TEST(WeatherNewsIconDatabase, EveryRowMapsToAWidgetIcon)
 {
-    RawDB db(WeatherTest::BuildDir() + "/res/com.quorvex.weather-m-widget/res/data/weathernews_icon.db", true);
+    RawDB db(WeatherTest::BuildDir() + "/res/com.quorvex.weather-m-widget/res/data/weathernews_icon.db",
+             true);
     ASSERT_TRUE(db.GetIsOpen());
     EXPECT_GT(db.QueryInt("SELECT COUNT(*) FROM icon_table"), 40);
-    EXPECT_EQ(0, db.QueryInt("SELECT COUNT(*) FROM icon_table WHERE typeof(icon_id) <> 'integer' OR "
-                             "typeof(day_mapping_id) <> 'integer' OR typeof(night_mapping_id) <> 'integer' OR "
-                             "day_mapping_id NOT BETWEEN 1 AND 22 OR night_mapping_id NOT BETWEEN 1 AND 22"));
+    EXPECT_EQ(0,
+              db.QueryInt("SELECT COUNT(*) FROM icon_table WHERE typeof(icon_id) <> 'integer' OR "
+                          "typeof(day_mapping_id) <> 'integer' OR typeof(night_mapping_id) <> 'integer' OR "
+                          "day_mapping_id NOT BETWEEN 1 AND 22 OR night_mapping_id NOT BETWEEN 1 AND 22"));
     // Night rows never show the sun, day rows never the night sky.
     EXPECT_EQ(0, db.QueryInt("SELECT COUNT(*) FROM icon_table WHERE night_mapping_id IN (1, 2, 7, 9, 11) OR "
                              "day_mapping_id IN (18, 19)"));

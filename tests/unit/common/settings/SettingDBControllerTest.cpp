@@ -21,15 +21,15 @@ class SettingDBControllerTest : public SettingsTest::SettingsFixture
 std::string Describe(const Setting& s)
 {
     std::ostringstream out;
-    out << s.GetCurrentCityIndex() << '|' << s.GetCurrentCityLocationId() << '|' << s.GetTemperatureUnit() << '|'
-        << s.GetLastRefreshedTime() << '|' << s.GetCurrentLocationAreaRefreshedTime() << '|' << s.GetIsFirstLaunch()
-        << s.GetAutoRefreshOn() << '|' << s.GetAutoRefreshInterval() << '|' << s.GetUseCurrentLocationOn()
-        << s.GetShowCurrentCityAgreement() << s.GetRefreshOnOpeningOn() << s.GetRefreshOnOpeningOnAgreement()
-        << s.GetNotificationOn() << '|' << s.GetNotificationTime() << '|' << s.GetNetworkPositionPopupAgreement()
-        << s.GetShowNetworkPopup() << s.GetChinaDataGPSPerformPopupOn() << s.GetAutoScrollOn() << '|'
-        << s.GetAutoScrollInterval() << '|' << s.GetLastUpdateLanguageCode() << '|' << s.GetCpType() << '|'
-        << s.GetDaemonType() << '|' << s.GetIsNowRefreshing() << s.GetIsSupportManualRefresh() << '|'
-        << s.GetRefreshingStartTime();
+    out << s.GetCurrentCityIndex() << '|' << s.GetCurrentCityLocationId() << '|' << s.GetTemperatureUnit()
+        << '|' << s.GetLastRefreshedTime() << '|' << s.GetCurrentLocationAreaRefreshedTime() << '|'
+        << s.GetIsFirstLaunch() << s.GetAutoRefreshOn() << '|' << s.GetAutoRefreshInterval() << '|'
+        << s.GetUseCurrentLocationOn() << s.GetShowCurrentCityAgreement() << s.GetRefreshOnOpeningOn()
+        << s.GetRefreshOnOpeningOnAgreement() << s.GetNotificationOn() << '|' << s.GetNotificationTime()
+        << '|' << s.GetNetworkPositionPopupAgreement() << s.GetShowNetworkPopup()
+        << s.GetChinaDataGPSPerformPopupOn() << s.GetAutoScrollOn() << '|' << s.GetAutoScrollInterval() << '|'
+        << s.GetLastUpdateLanguageCode() << '|' << s.GetCpType() << '|' << s.GetDaemonType() << '|'
+        << s.GetIsNowRefreshing() << s.GetIsSupportManualRefresh() << '|' << s.GetRefreshingStartTime();
     return out.str();
 }
 
@@ -120,10 +120,12 @@ TEST_F(SettingDBControllerTest, NullRecordWritesNothingAndDisplayCityWritesOneCo
 TEST_F(SettingDBControllerTest, MissingDatabaseIsNeitherReadNorCreated)
 {
     EXPECT_EQ(ERR_FAIL, SettingDBController().Initialize());
-    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetSettingDBFilePath(), false) == false")) << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetSettingDBFilePath(), false) == false"))
+        << mLog.Dump();
     MakeDBDir();
     EXPECT_FALSE(SettingDBController().Select());
-    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetSettingDBFilePath(), true) == false")) << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetSettingDBFilePath(), true) == false"))
+        << mLog.Dump();
     EXPECT_FALSE(SettingsTest::FileExists(SettingDBPath()));
 }
 
@@ -160,8 +162,7 @@ struct Writer
         char byte = 'g';
         int status = -1;
         bool ok = write(go[1], &byte, 1) == 1 && waitpid(pid, &status, 0) == pid;
-        for (int fd : {ready[0], ready[1], go[0], go[1]})
-            close(fd);
+        for (int fd : {ready[0], ready[1], go[0], go[1]}) close(fd);
         return ok && WIFEXITED(status) ? WEXITSTATUS(status) : -1;
     }
 };
@@ -171,10 +172,12 @@ TEST_F(SettingDBControllerTest, LaterWriterOfTwoProcessesWinsEveryColumn)
     InitializeSettings();
     Writer first;
     Writer second;
-    first.Start([](Setting& s) {
-        s.SetTemperatureUnit(0);
-        s.SetCpType("Kweather");
-    });
+    first.Start(
+        [](Setting& s)
+        {
+            s.SetTemperatureUnit(0);
+            s.SetCpType("Kweather");
+        });
     second.Start([](Setting& s) { s.SetCpType("cmaweather"); });
     EXPECT_EQ(0, first.Finish());
     EXPECT_EQ("Kweather", SettingDBController().Select()->GetCpType());

@@ -90,17 +90,43 @@ std::vector<std::string> RawDB::ColumnNames(const std::string& table)
 // suite create them.
 const std::pair<const char*, const char*> WEATHER_TABLE_FORMATS[6] = {
     {"CITY_TABLE",
-     "CREATE TABLE IF NOT EXISTS %s (PK_ID\t\t\t\tINTEGER NOT NULL PRIMARY KEY AUTOINCREMENT,pageIndex\t\t\tINTEGER,locationId\t\t\tTEXT,cityName\t\t\tTEXT,cityNameEng\t\tTEXT,countryName\t\tTEXT,countryNameEng\t\tTEXT,isCurrentLocation\tINTEGER,isSummerTime\t\tINTEGER,isDayTime\t\t\tINTEGER,gmtOffset\t\t\tDOUBLE,refreshedTime\t\tINT64,localTime\t\t\tINT64,widgetReferenceCount\t\tINTEGER,needToUpdate\t\tINTEGER,websiteUrl \t\tTEXT);"},
+     "CREATE TABLE IF NOT EXISTS %s (PK_ID\t\t\t\tINTEGER NOT NULL PRIMARY KEY "
+     "AUTOINCREMENT,pageIndex\t\t\tINTEGER,locationId\t\t\tTEXT,cityName\t\t\tTEXT,cityNameEng\t\tTEXT,"
+     "countryName\t\tTEXT,countryNameEng\t\tTEXT,isCurrentLocation\tINTEGER,isSummerTime\t\tINTEGER,"
+     "isDayTime\t\t\tINTEGER,gmtOffset\t\t\tDOUBLE,refreshedTime\t\tINT64,localTime\t\t\tINT64,"
+     "widgetReferenceCount\t\tINTEGER,needToUpdate\t\tINTEGER,websiteUrl \t\tTEXT);"},
     {"CURRENT_WEATHER_TABLE",
-     "CREATE TABLE IF NOT EXISTS %s (FK_ID\t\t\t\tINTEGER,weatherIcon\t\tINTEGER,weatherStatus\t\tTEXT,curTemperature\t\tDOUBLE,lowTemperature\t\tDOUBLE,highTemperature\tDOUBLE,date\t\t\t\tINT64,websiteUrl \t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);"},
+     "CREATE TABLE IF NOT EXISTS %s "
+     "(FK_ID\t\t\t\tINTEGER,weatherIcon\t\tINTEGER,weatherStatus\t\tTEXT,curTemperature\t\tDOUBLE,"
+     "lowTemperature\t\tDOUBLE,highTemperature\tDOUBLE,date\t\t\t\tINT64,websiteUrl \t\tTEXT,FOREIGN "
+     "KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);"},
     {"HOURLY_WEATHER_TABLE",
-     "CREATE TABLE IF NOT EXISTS %s (FK_ID\t\t\t\tINTEGER,hourlyIndex\t\tINTEGER,hour\t\t\t\tINT64,weatherIcon\t\tINTEGER,weatherStatus\t\tTEXT,curTemperature\t\tDOUBLE,lowTemperature\t\tDOUBLE,highTemperature\tDOUBLE,websiteUrl\t\t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);"},
+     "CREATE TABLE IF NOT EXISTS %s "
+     "(FK_ID\t\t\t\tINTEGER,hourlyIndex\t\tINTEGER,hour\t\t\t\tINT64,weatherIcon\t\tINTEGER,"
+     "weatherStatus\t\tTEXT,curTemperature\t\tDOUBLE,lowTemperature\t\tDOUBLE,highTemperature\tDOUBLE,"
+     "websiteUrl\t\t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE "
+     "CASCADE);"},
     {"WEEKLY_WEATHER_TABLE",
-     "CREATE TABLE IF NOT EXISTS %s (FK_ID\t\t\t\tINTEGER,weeklyIndex\t\tINTEGER,weatherIcon\t\tINTEGER,weatherStatus\t\tTEXT,curTemperature\t\tDOUBLE,lowTemperature\t\tDOUBLE,highTemperature\tDOUBLE,date\t\t\t\tINT64,websiteUrl \t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);"},
+     "CREATE TABLE IF NOT EXISTS %s "
+     "(FK_ID\t\t\t\tINTEGER,weeklyIndex\t\tINTEGER,weatherIcon\t\tINTEGER,weatherStatus\t\tTEXT,"
+     "curTemperature\t\tDOUBLE,lowTemperature\t\tDOUBLE,highTemperature\tDOUBLE,date\t\t\t\tINT64,websiteUrl "
+     "\t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);"},
     {"EXTRA_WEATHER_TABLE",
-     "CREATE TABLE IF NOT EXISTS %s (FK_ID\t\t\t\tINTEGER,humidity\t\t\tINTEGER,sunsetTime\t\t\tINT64,sunriseTime\t\tINT64,pm25\t\t\t\tINTEGER,pm10\t\t\t\tINTEGER,aqi\t\t\t\tINTEGER,uvIndex\t\t\tINTEGER,outdoorExcercise\tINTEGER,comfort\t\t\tINTEGER,clothing\t\t\tINTEGER,skincare\t\t\tINTEGER,carwash\t\t\tINTEGER,foodPoison\t\t\tINTEGER,heat\t\t\t\tINTEGER,spoiledFood\t\tINTEGER,discomfort\t\t\tINTEGER,frozenPipes\t\tINTEGER,frostbite\t\t\tINTEGER,cold\t\t\t\tINTEGER,pollen\t\t\t\tINTEGER,airDust\t\t\tINTEGER,drySkin\t\t\tINTEGER,realfeel\t\t\tDOUBLE,precType\t\t\tINTEGER,precProbability\tDOUBLE,precAmount\t\t\tDOUBLE,precProbabilityNight\tDOUBLE,precAmountNight\t\t\tDOUBLE,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);"},
+     "CREATE TABLE IF NOT EXISTS %s "
+     "(FK_ID\t\t\t\tINTEGER,humidity\t\t\tINTEGER,sunsetTime\t\t\tINT64,sunriseTime\t\tINT64,"
+     "pm25\t\t\t\tINTEGER,pm10\t\t\t\tINTEGER,aqi\t\t\t\tINTEGER,uvIndex\t\t\tINTEGER,"
+     "outdoorExcercise\tINTEGER,comfort\t\t\tINTEGER,clothing\t\t\tINTEGER,skincare\t\t\tINTEGER,"
+     "carwash\t\t\tINTEGER,foodPoison\t\t\tINTEGER,heat\t\t\t\tINTEGER,spoiledFood\t\tINTEGER,"
+     "discomfort\t\t\tINTEGER,frozenPipes\t\tINTEGER,frostbite\t\t\tINTEGER,cold\t\t\t\tINTEGER,"
+     "pollen\t\t\t\tINTEGER,airDust\t\t\tINTEGER,drySkin\t\t\tINTEGER,realfeel\t\t\tDOUBLE,"
+     "precType\t\t\tINTEGER,precProbability\tDOUBLE,precAmount\t\t\tDOUBLE,precProbabilityNight\tDOUBLE,"
+     "precAmountNight\t\t\tDOUBLE,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON "
+     "UPDATE CASCADE);"},
     {"MOON_PHASE_TABLE",
-     "CREATE TABLE IF NOT EXISTS %s (FK_ID\t\t\t\tINTEGER,moonPhaseIndex\t\tINTEGER,locationID\t\t\tTEXT,date\t\t\t\tINT64,moonRiseTime\t\tINT64,moonSetTime\t\tINT64,phaseText\t\t\tTEXT,age\t\t\t\tINTEGER,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);"},
+     "CREATE TABLE IF NOT EXISTS %s "
+     "(FK_ID\t\t\t\tINTEGER,moonPhaseIndex\t\tINTEGER,locationID\t\t\tTEXT,date\t\t\t\tINT64,"
+     "moonRiseTime\t\tINT64,moonSetTime\t\tINT64,phaseText\t\t\tTEXT,age\t\t\t\tINTEGER,FOREIGN KEY(FK_ID) "
+     "REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);"},
 };
 
 namespace
@@ -114,17 +140,28 @@ struct AddedColumn
 };
 
 const AddedColumn ADDED_COLUMNS[] = {
-    {"CITY_TABLE", "countryNameEng", 0.1},       {"HOURLY_WEATHER_TABLE", "websiteUrl", 0.2},
-    {"EXTRA_WEATHER_TABLE", "aqi", 0.3},         {"EXTRA_WEATHER_TABLE", "pm25", 0.3},
-    {"EXTRA_WEATHER_TABLE", "outdoorExcercise", 0.4}, {"EXTRA_WEATHER_TABLE", "comfort", 0.4},
-    {"EXTRA_WEATHER_TABLE", "clothing", 0.4},    {"EXTRA_WEATHER_TABLE", "skincare", 0.4},
-    {"EXTRA_WEATHER_TABLE", "carwash", 0.4},     {"CITY_TABLE", "needToUpdate", 0.5},
-    {"EXTRA_WEATHER_TABLE", "foodPoison", 0.6},  {"EXTRA_WEATHER_TABLE", "heat", 0.6},
-    {"EXTRA_WEATHER_TABLE", "spoiledFood", 0.6}, {"EXTRA_WEATHER_TABLE", "discomfort", 0.6},
-    {"EXTRA_WEATHER_TABLE", "frozenPipes", 0.6}, {"EXTRA_WEATHER_TABLE", "frostbite", 0.6},
-    {"EXTRA_WEATHER_TABLE", "cold", 0.6},        {"EXTRA_WEATHER_TABLE", "pollen", 0.6},
-    {"EXTRA_WEATHER_TABLE", "airDust", 0.6},     {"EXTRA_WEATHER_TABLE", "drySkin", 0.6},
-    {"CITY_TABLE", "isSummerTime", 0.7},         {"EXTRA_WEATHER_TABLE", "precProbabilityNight", 0.8},
+    {"CITY_TABLE", "countryNameEng", 0.1},
+    {"HOURLY_WEATHER_TABLE", "websiteUrl", 0.2},
+    {"EXTRA_WEATHER_TABLE", "aqi", 0.3},
+    {"EXTRA_WEATHER_TABLE", "pm25", 0.3},
+    {"EXTRA_WEATHER_TABLE", "outdoorExcercise", 0.4},
+    {"EXTRA_WEATHER_TABLE", "comfort", 0.4},
+    {"EXTRA_WEATHER_TABLE", "clothing", 0.4},
+    {"EXTRA_WEATHER_TABLE", "skincare", 0.4},
+    {"EXTRA_WEATHER_TABLE", "carwash", 0.4},
+    {"CITY_TABLE", "needToUpdate", 0.5},
+    {"EXTRA_WEATHER_TABLE", "foodPoison", 0.6},
+    {"EXTRA_WEATHER_TABLE", "heat", 0.6},
+    {"EXTRA_WEATHER_TABLE", "spoiledFood", 0.6},
+    {"EXTRA_WEATHER_TABLE", "discomfort", 0.6},
+    {"EXTRA_WEATHER_TABLE", "frozenPipes", 0.6},
+    {"EXTRA_WEATHER_TABLE", "frostbite", 0.6},
+    {"EXTRA_WEATHER_TABLE", "cold", 0.6},
+    {"EXTRA_WEATHER_TABLE", "pollen", 0.6},
+    {"EXTRA_WEATHER_TABLE", "airDust", 0.6},
+    {"EXTRA_WEATHER_TABLE", "drySkin", 0.6},
+    {"CITY_TABLE", "isSummerTime", 0.7},
+    {"EXTRA_WEATHER_TABLE", "precProbabilityNight", 0.8},
     {"EXTRA_WEATHER_TABLE", "precAmountNight", 0.8},
 };
 

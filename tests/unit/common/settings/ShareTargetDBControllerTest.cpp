@@ -44,7 +44,8 @@ TEST_F(ShareTargetDBControllerTest, OneRowPerExactAppIdInInsertOrder)
     EXPECT_TRUE(mLog.Contains("There is a same appId. so we didn't insert this app")) << mLog.Dump();
     Insert("com.example", "port.c");
     Insert("COM.EXAMPLE.A", "port.d");
-    EXPECT_EQ("com.example.a=port.first;com.example.b=port.b;com.example=port.c;COM.EXAMPLE.A=port.d;", Listed());
+    EXPECT_EQ("com.example.a=port.first;com.example.b=port.b;com.example=port.c;COM.EXAMPLE.A=port.d;",
+              Listed());
 }
 
 TEST_F(ShareTargetDBControllerTest, InitializeAgainKeepsRowsAndMissingTableTakesNothing)
@@ -52,7 +53,8 @@ TEST_F(ShareTargetDBControllerTest, InitializeAgainKeepsRowsAndMissingTableTakes
     Insert("com.example.a", "port.a");
     EXPECT_EQ(ERR_OK, ShareTargetDBController().Initialize());
     EXPECT_EQ(
-        "CREATE TABLE SHARE_TARGET_TABLE (PK_ID\tINTEGER NOT NULL PRIMARY KEY AUTOINCREMENT,AppID\tTEXT, PortID\tTEXT)",
+        "CREATE TABLE SHARE_TARGET_TABLE (PK_ID\tINTEGER NOT NULL PRIMARY KEY AUTOINCREMENT,AppID\tTEXT, "
+        "PortID\tTEXT)",
         RawDB(ShareTargetDBPath()).TableSql("SHARE_TARGET_TABLE"));
     EXPECT_EQ("com.example.a=port.a;", Listed());
 

@@ -40,7 +40,8 @@ std::set<std::string> LowerCase(const std::vector<std::string>& names)
     std::set<std::string> lower;
     for (std::string name : names)
     {
-        std::transform(name.begin(), name.end(), name.begin(), [](unsigned char c) { return std::tolower(c); });
+        std::transform(name.begin(), name.end(), name.begin(),
+                       [](unsigned char c) { return std::tolower(c); });
         lower.insert(name);
     }
     return lower;
@@ -60,20 +61,29 @@ protected:
             db.Exec(SettingsTest::OldWeatherTableSql(table.first, version));
         if (version < 0.2)
             db.Exec("CREATE TABLE VERSION_TABLE (dbVersion DOUBLE); INSERT INTO VERSION_TABLE VALUES (0.1);");
-        db.Exec("INSERT INTO CITY_TABLE (pageIndex, locationId, cityName, cityNameEng, countryName, "
-                "isCurrentLocation, isDayTime, gmtOffset, refreshedTime, localTime, widgetReferenceCount, websiteUrl) "
-                "VALUES (0, '226396', 'Seoul', 'Seoul', 'Korea', 0, 1, 9, 1700000000, 1700032400, 2, 'http://a'), "
-                "(1, '" + currentLocationId + "', 'Here', 'Here', 'Land', 1, 0, -3.5, 1700000100, 1699987500, 1, "
-                "'http://b');");
-        db.Exec("INSERT INTO CURRENT_WEATHER_TABLE (FK_ID, weatherIcon, weatherStatus, curTemperature, "
-                "lowTemperature, highTemperature, date, websiteUrl) VALUES (1, 3, 'Cloudy', 12.5, 8, 15, 1700000000, "
-                "'u'), (2, 1, 'Sunny', 25, 20, 30, 1700000100, 'v');");
+        db.Exec(
+            "INSERT INTO CITY_TABLE (pageIndex, locationId, cityName, cityNameEng, countryName, "
+            "isCurrentLocation, isDayTime, gmtOffset, refreshedTime, localTime, widgetReferenceCount, "
+            "websiteUrl) "
+            "VALUES (0, '226396', 'Seoul', 'Seoul', 'Korea', 0, 1, 9, 1700000000, 1700032400, 2, "
+            "'http://a'), "
+            "(1, '" +
+            currentLocationId +
+            "', 'Here', 'Here', 'Land', 1, 0, -3.5, 1700000100, 1699987500, 1, "
+            "'http://b');");
+        db.Exec(
+            "INSERT INTO CURRENT_WEATHER_TABLE (FK_ID, weatherIcon, weatherStatus, curTemperature, "
+            "lowTemperature, highTemperature, date, websiteUrl) VALUES (1, 3, 'Cloudy', 12.5, 8, 15, "
+            "1700000000, "
+            "'u'), (2, 1, 'Sunny', 25, 20, 30, 1700000100, 'v');");
         db.Exec("INSERT INTO EXTRA_WEATHER_TABLE (FK_ID, humidity, uvIndex) VALUES (1, 55, 3), (2, 80, 7);");
-        db.Exec("INSERT INTO HOURLY_WEATHER_TABLE (FK_ID, hourlyIndex, hour, weatherIcon, weatherStatus, "
-                "curTemperature) VALUES (2, 0, 1700003600, 1, 'Sunny', 24), (2, 1, 1700007200, 2, 'Sunny', 23);");
-        db.Exec("CREATE TABLE CITY_REWRITES (locationId TEXT);"
-                "CREATE TRIGGER CITY_REWRITTEN AFTER UPDATE ON CITY_TABLE "
-                "BEGIN INSERT INTO CITY_REWRITES VALUES (NEW.locationId); END;");
+        db.Exec(
+            "INSERT INTO HOURLY_WEATHER_TABLE (FK_ID, hourlyIndex, hour, weatherIcon, weatherStatus, "
+            "curTemperature) VALUES (2, 0, 1700003600, 1, 'Sunny', 24), (2, 1, 1700007200, 2, 'Sunny', 23);");
+        db.Exec(
+            "CREATE TABLE CITY_REWRITES (locationId TEXT);"
+            "CREATE TRIGGER CITY_REWRITTEN AFTER UPDATE ON CITY_TABLE "
+            "BEGIN INSERT INTO CITY_REWRITES VALUES (NEW.locationId); END;");
     }
 
     void WriteVersion(double version)
@@ -84,7 +94,10 @@ protected:
         db.Exec("INSERT INTO VERSION_TABLE VALUES (" + std::to_string(version) + ");");
     }
 
-    double StoredVersion() { return RawDB(VersionDBPath(), true).QueryDouble("SELECT dbVersion FROM VERSION_TABLE"); }
+    double StoredVersion()
+    {
+        return RawDB(VersionDBPath(), true).QueryDouble("SELECT dbVersion FROM VERSION_TABLE");
+    }
 
     void ExpectCompleteColumns()
     {
@@ -102,15 +115,18 @@ protected:
     void ExpectRowsKept()
     {
         RawDB db(WeatherDBPath(), true);
-        EXPECT_EQ("Seoul|Korea|2|Here|Land|1",
-                  db.QueryText("SELECT a.cityName || '|' || a.countryName || '|' || a.widgetReferenceCount || '|' || "
-                               "b.cityName || '|' || b.countryName || '|' || b.widgetReferenceCount FROM CITY_TABLE a, "
-                               "CITY_TABLE b WHERE a.pageIndex = 0 AND b.pageIndex = 1"));
+        EXPECT_EQ(
+            "Seoul|Korea|2|Here|Land|1",
+            db.QueryText(
+                "SELECT a.cityName || '|' || a.countryName || '|' || a.widgetReferenceCount || '|' || "
+                "b.cityName || '|' || b.countryName || '|' || b.widgetReferenceCount FROM CITY_TABLE a, "
+                "CITY_TABLE b WHERE a.pageIndex = 0 AND b.pageIndex = 1"));
         EXPECT_EQ(2, db.QueryInt("SELECT COUNT(*) FROM CURRENT_WEATHER_TABLE"));
         EXPECT_EQ("55|80", db.QueryText("SELECT group_concat(humidity, '|') FROM (SELECT humidity FROM "
                                         "EXTRA_WEATHER_TABLE ORDER BY FK_ID)"));
         EXPECT_EQ(2, db.QueryInt("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE WHERE FK_ID = 2"));
-        EXPECT_DOUBLE_EQ(25.0, db.QueryDouble("SELECT curTemperature FROM CURRENT_WEATHER_TABLE WHERE FK_ID = 2"));
+        EXPECT_DOUBLE_EQ(25.0,
+                         db.QueryDouble("SELECT curTemperature FROM CURRENT_WEATHER_TABLE WHERE FK_ID = 2"));
     }
 };
 
@@ -131,7 +147,8 @@ TEST_P(UpgradeFromVersionTest, StartUpBringsTheOldFileToTheLatestSchema)
     ExpectCompleteColumns();
     ExpectRowsKept();
     for (const StepLog& step : STEP_LOGS)
-        EXPECT_EQ(version < step.belowVersion ? 1 : 0, mLog.Count(step.line)) << step.line << "\n" << mLog.Dump();
+        EXPECT_EQ(version < step.belowVersion ? 1 : 0, mLog.Count(step.line)) << step.line << "\n"
+                                                                              << mLog.Dump();
     EXPECT_EQ(version < 0.8 ? 1 : 0, mLog.Count("Need to upgrade DB : CurrentVersion[")) << mLog.Dump();
 
     RawDB db(WeatherDBPath(), true);
@@ -146,7 +163,8 @@ TEST_P(UpgradeFromVersionTest, StartUpBringsTheOldFileToTheLatestSchema)
     EXPECT_EQ(1, RawDB(VersionDBPath(), true).QueryInt("SELECT COUNT(*) FROM VERSION_TABLE"));
 }
 
-INSTANTIATE_TEST_SUITE_P(OldInstallations, UpgradeFromVersionTest, ::testing::Values(0.0, 0.1, 0.3, 0.7, 0.8));
+INSTANTIATE_TEST_SUITE_P(OldInstallations, UpgradeFromVersionTest,
+                         ::testing::Values(0.0, 0.1, 0.3, 0.7, 0.8));
 
 TEST_F(UpgradeFixture, CurrentLocationIdWithSuffixIsNotRewritten)
 {
@@ -177,7 +195,8 @@ TEST_F(UpgradeFixture, UnopenableWeatherDatabaseLeavesTheVersionForTheNextStart)
     ASSERT_EQ(0, mkdir(WeatherDBPath().c_str(), 0755));
 
     DataStoreInitializer::Run();
-    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false")) << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false"))
+        << mLog.Dump();
     EXPECT_EQ(1, mLog.Count("UpgradeDBTables < 0.4 : ")) << mLog.Dump();
     EXPECT_EQ(0, mLog.Count("UpgradeDBTables < 0.5 : ")) << mLog.Dump();
     EXPECT_DOUBLE_EQ(0.3, StoredVersion());
@@ -196,7 +215,8 @@ TEST_F(UpgradeFixture, UnreadableVersionDatabaseCountsAsVersionZero)
 {
     MakeDBDir();
     EXPECT_DOUBLE_EQ(0.0, VersionDBController().GetCurrentDBVersion());
-    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetVersionDBFilePath(), true) == false")) << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetVersionDBFilePath(), true) == false"))
+        << mLog.Dump();
     UpgradeDBController controller;
     EXPECT_TRUE(controller.IsNeedToUpgrade());
     EXPECT_DOUBLE_EQ(0.0, controller.GetCurrentVersion());
