@@ -32,23 +32,40 @@ struct SampleCity
 };
 
 const SampleCity kCities[] = {
-    {"Seoul", "Sun, 6 Dec 21:48", 2, "22", "06/12", "21:40",
+    {"Seoul",
+     "Sun, 6 Dec 21:48",
+     2,
+     "22",
+     "06/12",
+     "21:40",
      {{"Mon", 1, "24", "15"}, {"Tue", 7, "21", "14"}, {"Wed", 4, "17", "12"}, {"Thu", 12, "3", "-2"}}},
-    {"Reykjavík", "Sun, 6 Dec 12:48", 12, "-3", "06/12", "12:31",
+    {"Reykjavík",
+     "Sun, 6 Dec 12:48",
+     12,
+     "-3",
+     "06/12",
+     "12:31",
      {{"Mon", 10, "-1", "-6"}, {"Tue", 3, "1", "-4"}, {"Wed", 17, "2", "-3"}, {"Thu", 12, "-2", "-8"}}},
-    {"San Francisco", "Sun, 6 Dec 04:48", 5, "13", "06/12", "04:30",
+    {"San Francisco",
+     "Sun, 6 Dec 04:48",
+     5,
+     "13",
+     "06/12",
+     "04:30",
      {{"Mon", 2, "17", "10"}, {"Tue", 1, "19", "11"}, {"Wed", 8, "15", "11"}, {"Thu", 6, "14", "9"}}},
 };
 
 const char* const kIconStems[] = {
-    "01.weather_view_sunny", "01.weather_view_sunny", "02.weather_view_partly_sunny",
-    "03.weather_view_cloudy", "04.weather_view_rain", "05.weather_view_fog",
-    "06.weather_view_shower", "07.weather_view_partly_sunny_with_shower",
+    "01.weather_view_sunny",         "01.weather_view_sunny",
+    "02.weather_view_partly_sunny",  "03.weather_view_cloudy",
+    "04.weather_view_rain",          "05.weather_view_fog",
+    "06.weather_view_shower",        "07.weather_view_partly_sunny_with_shower",
     "08.weather_view_thunderstorms", "09.weather_view_partly_sunny_with_thunder_showers",
-    "10.weather_view_flurries", "11.weather_view_partly_sunny_with_flurries",
-    "12.weather_view_snow", "13.weather_view_rain_and_snow_mixed", "14.weather_view_ice",
-    "15.weather_view_hot", "16.weather_view_cold", "17.weather_view_windy",
-    "18.weather_view_clear", "19.weather_view_mostly_clear"};
+    "10.weather_view_flurries",      "11.weather_view_partly_sunny_with_flurries",
+    "12.weather_view_snow",          "13.weather_view_rain_and_snow_mixed",
+    "14.weather_view_ice",           "15.weather_view_hot",
+    "16.weather_view_cold",          "17.weather_view_windy",
+    "18.weather_view_clear",         "19.weather_view_mostly_clear"};
 
 const char* Tr(const char* id)
 {
@@ -65,9 +82,7 @@ bool SetContent(Evas_Object* layout, const char* part, Evas_Object* content)
 
 }  // namespace
 
-LayoutSample::LayoutSample(const std::string& resDir, bool is4x4) : mResDir(resDir), mIs4x4(is4x4)
-{
-}
+LayoutSample::LayoutSample(const std::string& resDir, bool is4x4) : mResDir(resDir), mIs4x4(is4x4) {}
 
 bool LayoutSample::ParseState(const std::string& text, PageState& state)
 {
@@ -75,9 +90,12 @@ bool LayoutSample::ParseState(const std::string& text, PageState& state)
     {
         const char* name;
         PageState state;
-    } kStates[] = {{"city", PageState::CITY},         {"current", PageState::CURRENT_LOCATION},
-                   {"nonetwork", PageState::NO_NETWORK}, {"pressed", PageState::PRESSED},
-                   {"nocity", PageState::NO_CITY},     {"loading", PageState::LOADING}};
+    } kStates[] = {{"city", PageState::CITY},
+                   {"current", PageState::CURRENT_LOCATION},
+                   {"nonetwork", PageState::NO_NETWORK},
+                   {"pressed", PageState::PRESSED},
+                   {"nocity", PageState::NO_CITY},
+                   {"loading", PageState::LOADING}};
     for (const auto& entry : kStates)
     {
         if (text == entry.name)
@@ -225,7 +243,8 @@ bool LayoutSample::FillForecast(Evas_Object* city, int cityIndex)
                                  (day.high + degree).c_str());
         elm_object_part_text_set(forecast, ("weatherForecastLowTemp" + n).c_str(),
                                  (day.low + degree).c_str());
-        if (!SetContent(forecast, ("weatherForecastIcon" + n).c_str(), Image(forecast, IconName(day.code, 96, false))) ||
+        if (!SetContent(forecast, ("weatherForecastIcon" + n).c_str(),
+                        Image(forecast, IconName(day.code, 96, false))) ||
             !SetContent(forecast, ("weatherForecastPressIcon" + n).c_str(),
                         Image(forecast, IconName(day.code, 96, true))))
             return false;
@@ -250,7 +269,8 @@ Evas_Object* LayoutSample::Layout(Evas_Object* parent, const std::string& file, 
 
 Evas_Object* LayoutSample::PageLayout(Evas_Object* parent, const char* group)
 {
-    return Layout(parent, mResDir + (mIs4x4 ? "widget/Widget4x4Page.edj" : "widget/Widget4x2Page.edj"), group);
+    return Layout(parent, mResDir + (mIs4x4 ? "widget/Widget4x4Page.edj" : "widget/Widget4x2Page.edj"),
+                  group);
 }
 
 Evas_Object* LayoutSample::Image(Evas_Object* parent, const std::string& name)

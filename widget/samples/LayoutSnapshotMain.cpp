@@ -55,8 +55,9 @@ Eina_Bool SnapshotTimerCb(void* data)
 
 int Usage()
 {
-    fprintf(stderr, "usage: weather-layout-snapshot <4x2|4x4> "
-                    "<city|current|nonetwork|pressed|nocity|loading> <out.png> [resource dir]\n");
+    fprintf(stderr,
+            "usage: weather-layout-snapshot <4x2|4x4> "
+            "<city|current|nonetwork|pressed|nocity|loading> <out.png> [resource dir]\n");
     return 2;
 }
 

@@ -56,16 +56,15 @@ widget_class_h SampleWidgetApp::CreateCb(void* data)
     return widget_app_class_create(instance, data);
 }
 
-void SampleWidgetApp::TerminateCb(void*)
-{
-}
+void SampleWidgetApp::TerminateCb(void*) {}
 
 int SampleWidgetApp::InstanceCreateCb(widget_context_h context, bundle*, int w, int h, void* data)
 {
     return Guarded(data, "create", [&](SampleWidgetApp* pThis) { return pThis->ShowPages(context, w, h); });
 }
 
-int SampleWidgetApp::InstanceDestroyCb(widget_context_h context, widget_app_destroy_type_e, bundle*, void* data)
+int SampleWidgetApp::InstanceDestroyCb(widget_context_h context, widget_app_destroy_type_e, bundle*,
+                                       void* data)
 {
     return Guarded(data, "destroy", [&](SampleWidgetApp* pThis) { return pThis->DropPages(context); });
 }

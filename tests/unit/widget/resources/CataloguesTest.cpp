@@ -49,14 +49,16 @@ std::map<std::string, std::string> ReadCatalogue(const std::string& path)
     const bool swap = magic == 0xde120495u;
     if (magic != 0x950412deu && !swap)
         return entries;
-    auto word = [&](size_t offset) -> uint32_t {
+    auto word = [&](size_t offset) -> uint32_t
+    {
         if (offset + 4 > data.size())
             return 0;
         uint32_t value = 0;
         std::memcpy(&value, data.data() + offset, 4);
         return swap ? __builtin_bswap32(value) : value;
     };
-    auto text = [&](uint32_t table, uint32_t index) -> std::string {
+    auto text = [&](uint32_t table, uint32_t index) -> std::string
+    {
         uint32_t length = word(table + index * 8);
         uint32_t offset = word(table + index * 8 + 4);
         if (uint64_t(offset) + length > data.size())
@@ -64,8 +66,7 @@ std::map<std::string, std::string> ReadCatalogue(const std::string& path)
         return data.substr(offset, length);
     };
     const uint32_t count = word(8);
-    for (uint32_t i = 0; i < count; ++i)
-        entries[text(word(12), i)] = text(word(16), i);
+    for (uint32_t i = 0; i < count; ++i) entries[text(word(12), i)] = text(word(16), i);
     return entries;
 }
 
@@ -107,7 +108,8 @@ TEST_P(CatalogueTest, HeaderDeclaresUtf8AndTheLanguage)
 }
 
 INSTANTIATE_TEST_SUITE_P(Languages, CatalogueTest, ::testing::Values("en", "ko"),
-                         [](const ::testing::TestParamInfo<const char*>& info) { return std::string(info.param); });
+                         [](const ::testing::TestParamInfo<const char*>& info)
+                         { return std::string(info.param); });
 
 TEST(KoreanCatalogueTest, SentencesAreInKorean)
 {

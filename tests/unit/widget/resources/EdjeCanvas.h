@@ -109,8 +109,7 @@ public:
     bool Saw(const std::string& signal, const std::string& source)
     {
         // A program's own emission is queued behind the signal that ran it.
-        for (int pass = 0; pass < 3; ++pass)
-            edje_object_message_signal_process(mObj);
+        for (int pass = 0; pass < 3; ++pass) edje_object_message_signal_process(mObj);
         for (const auto& seen : mSeen)
         {
             if (seen.first == signal && seen.second == source)

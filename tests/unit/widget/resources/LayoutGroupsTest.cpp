@@ -29,12 +29,16 @@ std::vector<GroupParts> PageGroups(bool is4x4)
         {"noCity", {"content"}, {}, {"backgroundTouchArea"}},
         {"noCityContent", {}, {"title", "message"}, {}},
         {"loading", {}, {"message"}, {"backgroundTouchArea"}},
-        {"city", {"cityNameSwallow", "iconAndTemperatureSwallow", "bottomLineSwallow"}, {"localTime"},
+        {"city",
+         {"cityNameSwallow", "iconAndTemperatureSwallow", "bottomLineSwallow"},
+         {"localTime"},
          {"todayTouchArea"}},
         {"cityName", {}, {"name"}, {}},
         {"cityNameCurrentLocation", {}, {"name"}, {}},
         {"iconAndTemperature", {"icon", "iconPress", "currentUnit", "currentUnitPress"}, {"current"}, {}},
-        {"bottomLine", {"cpLogo", "refreshButton", "cpLogoEffect", "refreshButtonEffect"}, {"date", "time", "msg"},
+        {"bottomLine",
+         {"cpLogo", "refreshButton", "cpLogoEffect", "refreshButtonEffect"},
+         {"date", "time", "msg"},
          {}},
         {"BottomLinePressEffect", {}, {}, {}},
     };
@@ -101,8 +105,7 @@ protected:
 
 TEST_P(PageLayoutTest, HasEveryGroupAndPartThePagesUse)
 {
-    for (const auto& group : PageGroups(Is4x4()))
-        ExpectParts(mCanvas, File(), group);
+    for (const auto& group : PageGroups(Is4x4())) ExpectParts(mCanvas, File(), group);
 }
 
 TEST_P(PageLayoutTest, UnknownGroupIsNotFound)
@@ -166,9 +169,8 @@ TEST_P(PageLayoutTest, ImageSlotsMatchTheImageSizes)
 }
 
 INSTANTIATE_TEST_SUITE_P(BothSizes, PageLayoutTest, ::testing::Values(false, true),
-                         [](const ::testing::TestParamInfo<bool>& info) {
-                             return info.param ? std::string("Page4x4") : std::string("Page4x2");
-                         });
+                         [](const ::testing::TestParamInfo<bool>& info)
+                         { return info.param ? std::string("Page4x4") : std::string("Page4x2"); });
 
 TEST(WidgetViewLayoutTest, HasThePageSlotsAndTheFlickArea)
 {

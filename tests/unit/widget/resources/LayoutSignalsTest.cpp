@@ -187,16 +187,16 @@ TEST_P(PageSignalsTest, WholeNoCityAndLoadingPagesAreTouchable)
 }
 
 INSTANTIATE_TEST_SUITE_P(BothSizes, PageSignalsTest, ::testing::Values(false, true),
-                         [](const ::testing::TestParamInfo<bool>& info) {
-                             return info.param ? std::string("Page4x4") : std::string("Page4x2");
-                         });
+                         [](const ::testing::TestParamInfo<bool>& info)
+                         { return info.param ? std::string("Page4x4") : std::string("Page4x2"); });
 
 class ForecastSignalsTest : public PageSignalsTest
 {
 protected:
     Evas_Object* LoadForecast()
     {
-        Evas_Object* forecast = mCanvas.Load(WidgetLayoutFile("Widget4x4Page.edj"), "weatherForecast", 712, 250);
+        Evas_Object* forecast =
+            mCanvas.Load(WidgetLayoutFile("Widget4x4Page.edj"), "weatherForecast", 712, 250);
         if (!forecast)
             return nullptr;
         for (int n = 1; n <= 4; ++n)
@@ -222,14 +222,11 @@ TEST_F(ForecastSignalsTest, TodayPressPressesEveryDay)
 {
     Evas_Object* forecast = LoadForecast();
     ASSERT_NE(forecast, nullptr);
-    for (int n = 1; n <= 4; ++n)
-        EXPECT_FALSE(RowPressed(forecast, n)) << n;
+    for (int n = 1; n <= 4; ++n) EXPECT_FALSE(RowPressed(forecast, n)) << n;
     Signal(forecast, "receiver,pressed,widgettoday", "weatherForecast");
-    for (int n = 1; n <= 4; ++n)
-        EXPECT_TRUE(RowPressed(forecast, n)) << n;
+    for (int n = 1; n <= 4; ++n) EXPECT_TRUE(RowPressed(forecast, n)) << n;
     Signal(forecast, "receiver,unpressed,widgettoday", "weatherForecast");
-    for (int n = 1; n <= 4; ++n)
-        EXPECT_FALSE(RowPressed(forecast, n)) << n;
+    for (int n = 1; n <= 4; ++n) EXPECT_FALSE(RowPressed(forecast, n)) << n;
 }
 
 TEST_F(ForecastSignalsTest, HoldingOneDayPressesOnlyThatDay)
@@ -240,8 +237,7 @@ TEST_F(ForecastSignalsTest, HoldingOneDayPressesOnlyThatDay)
     Centre(forecast, "forecast3", x, y);
     mCanvas.Press(x, y);
     EXPECT_TRUE(RowPressed(forecast, 3));
-    for (int n : {1, 2, 4})
-        EXPECT_FALSE(RowPressed(forecast, n)) << n;
+    for (int n : {1, 2, 4}) EXPECT_FALSE(RowPressed(forecast, n)) << n;
     mCanvas.Release(x, y);
     EXPECT_FALSE(RowPressed(forecast, 3));
 }

@@ -145,11 +145,11 @@ TEST_F(WidgetResourcesTest, PressedIconDiffersFromTheNormalOne)
     const Evas_Object* pressed = LoadImage("04.weather_view_rain_press_96x96.png", 96);
     ASSERT_NE(normal, nullptr);
     ASSERT_NE(pressed, nullptr);
-    auto alphaSum = [](const Evas_Object* image) {
+    auto alphaSum = [](const Evas_Object* image)
+    {
         const auto* pixels = static_cast<const unsigned int*>(evas_object_image_data_get(image, EINA_FALSE));
         unsigned long sum = 0;
-        for (int i = 0; pixels && i < 96 * 96; ++i)
-            sum += pixels[i] >> 24;
+        for (int i = 0; pixels && i < 96 * 96; ++i) sum += pixels[i] >> 24;
         return sum;
     };
     unsigned long normalAlpha = alphaSum(normal);
@@ -175,7 +175,8 @@ TEST(ResourceFilesTest, IconLicenceShipsWithTheImages)
 
 TEST(ResourceFilesTest, LayoutFilesAreReadableByEveryone)
 {
-    for (const char* name : {"WidgetView.edj", "Widget4x2Page.edj", "Widget4x4Page.edj", "WidgetResources.edj"})
+    for (const char* name :
+         {"WidgetView.edj", "Widget4x2Page.edj", "Widget4x4Page.edj", "WidgetResources.edj"})
     {
         struct stat st;
         ASSERT_EQ(stat(WidgetLayoutFile(name).c_str(), &st), 0) << name;
