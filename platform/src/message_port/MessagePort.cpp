@@ -5,7 +5,6 @@
 #include <Ecore.h>
 #include <sys/socket.h>
 #include <sys/stat.h>
-#include <sys/un.h>
 #include <unistd.h>
 
 #include <cerrno>
@@ -18,6 +17,7 @@
 #include <string>
 
 #include "core/PlatformRoot.h"
+#include "core/UnixSocket.h"
 #include "dlog.h"
 #include "message_port/MessageEnvelope.h"
 
@@ -66,17 +66,6 @@ LocalPortPtr FindPortByName(const std::string& name)
 std::string PortDir()
 {
     return platform::RootPath("run/msgport");
-}
-
-// False when the path does not fit a socket address.
-bool MakeAddress(const std::string& path, sockaddr_un& address)
-{
-    memset(&address, 0, sizeof(address));
-    address.sun_family = AF_UNIX;
-    if (path.size() >= sizeof(address.sun_path))
-        return false;
-    memcpy(address.sun_path, path.c_str(), path.size() + 1);
-    return true;
 }
 
 bool IsValidPortName(const char* name)
@@ -140,41 +129,23 @@ Eina_Bool PortReadableCb(void* data, Ecore_Fd_Handler*)
     return ECORE_CALLBACK_RENEW;
 }
 
-// A socket file that still answers belongs to a live port of some process.
-bool IsLive(const sockaddr_un& address)
-{
-    int probe = socket(AF_UNIX, SOCK_DGRAM | SOCK_CLOEXEC, 0);
-    if (probe < 0)
-        return false;
-    bool live = connect(probe, reinterpret_cast<const sockaddr*>(&address), sizeof(address)) == 0;
-    close(probe);
-    return live;
-}
-
 int OpenPortSocket(const std::string& name, const std::string& path)
 {
-    sockaddr_un address;
-    if (!MakeAddress(path, address))
+    int fd = -1;
+    switch (platform::BindUnixSocket(path, SOCK_DGRAM, 0600, fd))
     {
-        dlog_print(DLOG_ERROR, kLogTag, "port path too long: %s", path.c_str());
-        return MESSAGE_PORT_ERROR_IO_ERROR;
+        case platform::UnixBindResult::BOUND:
+            return fd;
+        case platform::UnixBindResult::PATH_TOO_LONG:
+            dlog_print(DLOG_ERROR, kLogTag, "port path too long: %s", path.c_str());
+            return MESSAGE_PORT_ERROR_IO_ERROR;
+        case platform::UnixBindResult::IN_USE:
+            dlog_print(DLOG_ERROR, kLogTag, "port %s is held by another process", name.c_str());
+            return MESSAGE_PORT_ERROR_RESOURCE_UNAVAILABLE;
+        default:
+            dlog_print(DLOG_ERROR, kLogTag, "cannot open port %s (errno %d)", name.c_str(), errno);
+            return MESSAGE_PORT_ERROR_IO_ERROR;
     }
-    if (IsLive(address))
-    {
-        dlog_print(DLOG_ERROR, kLogTag, "port %s is held by another process", name.c_str());
-        return MESSAGE_PORT_ERROR_RESOURCE_UNAVAILABLE;
-    }
-    unlink(path.c_str());
-    int fd = socket(AF_UNIX, SOCK_DGRAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0);
-    if (fd < 0 || bind(fd, reinterpret_cast<const sockaddr*>(&address), sizeof(address)) != 0 ||
-        chmod(path.c_str(), 0600) != 0)
-    {
-        dlog_print(DLOG_ERROR, kLogTag, "cannot open port %s (errno %d)", name.c_str(), errno);
-        if (fd >= 0)
-            close(fd);
-        return MESSAGE_PORT_ERROR_IO_ERROR;
-    }
-    return fd;
 }
 
 int AddPort(const char* name, message_port_message_cb callback, void* userData)
@@ -232,7 +203,7 @@ int MapSendError(int error, const char* port)
 int SendDatagram(const char* remotePort, const std::string& datagram)
 {
     sockaddr_un address;
-    if (!MakeAddress(PortDir() + "/" + remotePort + ".sock", address))
+    if (!platform::MakeUnixAddress(PortDir() + "/" + remotePort + ".sock", address))
         return MESSAGE_PORT_ERROR_PORT_NOT_FOUND;
     int fd = socket(AF_UNIX, SOCK_DGRAM | SOCK_CLOEXEC, 0);
     if (fd < 0)

@@ -5,10 +5,10 @@
 #include <cstring>
 #include <poll.h>
 #include <sys/socket.h>
-#include <sys/un.h>
 #include <unistd.h>
 
 #include "core/PlatformRoot.h"
+#include "core/UnixSocket.h"
 
 namespace platform
 {
@@ -35,17 +35,8 @@ std::string ControlClient::SocketPath(const std::string& widgetId)
 bool ControlClient::Connect(const std::string& socketPath)
 {
     Disconnect();
-    sockaddr_un address;
-    memset(&address, 0, sizeof(address));
-    address.sun_family = AF_UNIX;
-    if (socketPath.size() >= sizeof(address.sun_path))
-        return false;
-    memcpy(address.sun_path, socketPath.c_str(), socketPath.size() + 1);
-    mFd = socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0);
-    if (mFd >= 0 && connect(mFd, reinterpret_cast<sockaddr*>(&address), sizeof(address)) == 0)
-        return true;
-    Disconnect();
-    return false;
+    mFd = ConnectUnixSocket(socketPath, SOCK_STREAM);
+    return mFd >= 0;
 }
 
 void ControlClient::Disconnect()

@@ -3,11 +3,10 @@
 #include <cerrno>
 #include <cstring>
 #include <sys/socket.h>
-#include <sys/stat.h>
-#include <sys/un.h>
 #include <unistd.h>
 
 #include "core/PlatformRoot.h"
+#include "core/UnixSocket.h"
 #include "dlog.h"
 #include "widget_errno.h"
 
@@ -18,24 +17,12 @@ namespace
 {
 const char* const kLogTag = "widget-host";
 
-bool FillAddress(const std::string& path, sockaddr_un& address)
+// A socket address can hold it and its folder exists (or has been made).
+bool IsUsablePath(const std::string& path)
 {
-    memset(&address, 0, sizeof(address));
-    address.sun_family = AF_UNIX;
-    if (path.size() >= sizeof(address.sun_path))
-        return false;
-    memcpy(address.sun_path, path.c_str(), path.size() + 1);
-    return true;
-}
-
-bool SomeoneListens(const sockaddr_un& address)
-{
-    int fd = socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0);
-    if (fd < 0)
-        return false;
-    bool answered = connect(fd, reinterpret_cast<const sockaddr*>(&address), sizeof(address)) == 0;
-    close(fd);
-    return answered;
+    sockaddr_un address;
+    size_t slash = path.rfind('/');
+    return MakeUnixAddress(path, address) && slash != std::string::npos && MakeDirs(path.substr(0, slash));
 }
 
 void WriteAll(int fd, const std::string& text)
@@ -63,25 +50,19 @@ ControlServer::~ControlServer()
 
 int ControlServer::Start(const std::string& path)
 {
-    sockaddr_un address;
-    size_t slash = path.rfind('/');
-    if (!FillAddress(path, address) || slash == std::string::npos || !MakeDirs(path.substr(0, slash)))
+    if (!IsUsablePath(path))
     {
         dlog_print(DLOG_ERROR, kLogTag, "control socket path %s is unusable", path.c_str());
         return WIDGET_ERROR_IO_ERROR;
     }
-    if (SomeoneListens(address))
+    // Only the owner may drive the widget.
+    UnixBindResult result = BindUnixSocket(path, SOCK_STREAM, 0600, mListenFd);
+    if (result == UnixBindResult::IN_USE)
     {
         dlog_print(DLOG_ERROR, kLogTag, "another host already answers on %s", path.c_str());
         return WIDGET_ERROR_ALREADY_STARTED;
     }
-    unlink(path.c_str());
-    mListenFd = socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0);
-    // Only the owner may drive the widget: the socket is made 0600 from the start.
-    mode_t oldMask = umask(0177);
-    bool bound = mListenFd >= 0 && bind(mListenFd, reinterpret_cast<sockaddr*>(&address), sizeof(address)) == 0;
-    umask(oldMask);
-    if (!bound || listen(mListenFd, 16) != 0)
+    if (result != UnixBindResult::BOUND || listen(mListenFd, 16) != 0)
     {
         dlog_print(DLOG_ERROR, kLogTag, "control socket %s: %s", path.c_str(), strerror(errno));
         Stop();
