@@ -1,13 +1,12 @@
 #include "CityDBController.h"
 
-#include <cstdio>
 #include <functional>
 #include <stdexcept>
 #include <vector>
 
 #include "CommonLog.h"
-#include "DBConnector.h"
 #include "DBStatement.h"
+#include "TableQuery.h"
 
 namespace NSWeather
 {
@@ -104,9 +103,7 @@ CityDBController::~CityDBController()
 
 void CityDBController::CreateTable()
 {
-    char query[1024] = {0};
-    snprintf(query, sizeof(query), CREATE_TABLE_FORMAT, TABLE_NAME);
-    DBConnector::GetInstance()->DBExecuteQuery(query);
+    TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
 }
 
 std::string CityDBController::ResolveLocationId(CityPtr cityPtr)
@@ -301,7 +298,7 @@ void CityDBController::Delete(int primaryKey)
 
 void CityDBController::DeleteAll()
 {
-    DBConnector::GetInstance()->DBExecuteQuery((std::string("DELETE FROM ") + TABLE_NAME + ";").c_str());
+    TableQuery::DeleteAll(TABLE_NAME);
 }
 
 void CityDBController::Reorder(CityPtrVectorPtr reorderPtrVector)

@@ -1,11 +1,10 @@
 #include "CurrentWeatherDBController.h"
 
-#include <cstdio>
 #include <string>
 
 #include "CommonLog.h"
-#include "DBConnector.h"
 #include "DBStatement.h"
+#include "TableQuery.h"
 
 namespace NSWeather
 {
@@ -63,64 +62,45 @@ CurrentWeatherDBController::~CurrentWeatherDBController()
 
 void CurrentWeatherDBController::CreateTable()
 {
-    char query[1024] = {0};
-    snprintf(query, sizeof(query), CREATE_TABLE_FORMAT, TABLE_NAME);
-    DBConnector::GetInstance()->DBExecuteQuery(query);
+    TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
 }
 
 void CurrentWeatherDBController::DeleteAll()
 {
-    DBConnector::GetInstance()->DBExecuteQuery((std::string("DELETE FROM ") + TABLE_NAME + ";").c_str());
+    TableQuery::DeleteAll(TABLE_NAME);
 }
 
 void CurrentWeatherDBController::Delete(int foreignKey)
 {
-    DBStatement stmt(std::string("DELETE FROM ") + TABLE_NAME + " WHERE FK_ID=?;");
-    stmt.BindInt(1, foreignKey);
-    if (stmt.Step() != SQLITE_DONE)
-        COMMON_LOG("Fail to Delete");
+    TableQuery::Delete(TABLE_NAME, foreignKey);
 }
 
 void CurrentWeatherDBController::Insert(int foreignKey, CurrentPtr currentPtr)
 {
     COMMON_RET_IF(!currentPtr);
-    DBStatement stmt(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS));
-    stmt.BindInt(1, foreignKey);
-    BindValues(stmt, 2, currentPtr);
-    stmt.Step();
+    TableQuery::InsertRecord(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS),
+                             foreignKey, currentPtr, BindValues);
 }
 
 void CurrentWeatherDBController::Update(int foreignKey, CurrentPtr currentPtr)
 {
     COMMON_RET_IF(!currentPtr);
-    DBStatement stmt(mQueryGenernator.MakeUpdateQuery(TABLE_NAME, UPDATE_ASSIGNMENTS,
-                                                      mQueryGenernator.MakeWhereClause("FK_ID = ?;")));
-    int i = BindValues(stmt, 1, currentPtr);
-    stmt.BindInt(i, foreignKey);
-    stmt.Step();
+    TableQuery::UpdateRecord(mQueryGenernator.MakeUpdateQuery(TABLE_NAME, UPDATE_ASSIGNMENTS,
+                                                              mQueryGenernator.MakeWhereClause("FK_ID = ?;")),
+                             foreignKey, currentPtr, BindValues);
 }
 
 CurrentPtr CurrentWeatherDBController::Select(int foreignKey)
 {
-    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS,
-                                                      mQueryGenernator.MakeWhereClause("FK_ID = ?")));
-    stmt.BindInt(1, foreignKey);
-    int rc = stmt.Step();
-    if (rc != SQLITE_ROW)
-    {
-        COMMON_LOG("No result : %d", rc);
-        return nullptr;
-    }
-    return ReadCurrent(stmt);
+    return TableQuery::Select(
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS, mQueryGenernator.MakeWhereClause("FK_ID = ?")),
+        foreignKey, ReadCurrent);
 }
 
 std::map<int, CurrentPtr> CurrentWeatherDBController::SelectAll()
 {
-    std::map<int, CurrentPtr> currentPtrMap;
-    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"));
-    while (stmt.Step() == SQLITE_ROW)
-        currentPtrMap.emplace(stmt.ColumnInt(7), ReadCurrent(stmt));
-    return currentPtrMap;
+    return TableQuery::SelectAllRecords(
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"), 7, ReadCurrent);
 }
 
 }  // namespace NSWeather

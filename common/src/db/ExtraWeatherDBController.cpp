@@ -1,11 +1,10 @@
 #include "ExtraWeatherDBController.h"
 
-#include <cstdio>
 #include <string>
 
 #include "CommonLog.h"
-#include "DBConnector.h"
 #include "DBStatement.h"
+#include "TableQuery.h"
 
 namespace NSWeather
 {
@@ -113,64 +112,45 @@ ExtraWeatherDBController::~ExtraWeatherDBController()
 
 void ExtraWeatherDBController::CreateTable()
 {
-    char query[1024] = {0};
-    snprintf(query, sizeof(query), CREATE_TABLE_FORMAT, TABLE_NAME);
-    DBConnector::GetInstance()->DBExecuteQuery(query);
+    TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
 }
 
 void ExtraWeatherDBController::DeleteAll()
 {
-    DBConnector::GetInstance()->DBExecuteQuery((std::string("DELETE FROM ") + TABLE_NAME + ";").c_str());
+    TableQuery::DeleteAll(TABLE_NAME);
 }
 
 void ExtraWeatherDBController::Delete(int foreignKey)
 {
-    DBStatement stmt(std::string("DELETE FROM ") + TABLE_NAME + " WHERE FK_ID=?;");
-    stmt.BindInt(1, foreignKey);
-    if (stmt.Step() != SQLITE_DONE)
-        COMMON_LOG("Fail to Delete");
+    TableQuery::Delete(TABLE_NAME, foreignKey);
 }
 
 void ExtraWeatherDBController::Insert(int foreignKey, ExtraPtr extraPtr)
 {
     COMMON_RET_IF(!extraPtr);
-    DBStatement stmt(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS));
-    stmt.BindInt(1, foreignKey);
-    BindValues(stmt, 2, extraPtr);
-    stmt.Step();
+    TableQuery::InsertRecord(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS),
+                             foreignKey, extraPtr, BindValues);
 }
 
 void ExtraWeatherDBController::Update(int foreignKey, ExtraPtr extraPtr)
 {
     COMMON_RET_IF(!extraPtr);
-    DBStatement stmt(mQueryGenernator.MakeUpdateQuery(TABLE_NAME, UPDATE_ASSIGNMENTS,
-                                                      mQueryGenernator.MakeWhereClause("FK_ID = ?")));
-    int i = BindValues(stmt, 1, extraPtr);
-    stmt.BindInt(i, foreignKey);
-    stmt.Step();
+    TableQuery::UpdateRecord(mQueryGenernator.MakeUpdateQuery(TABLE_NAME, UPDATE_ASSIGNMENTS,
+                                                              mQueryGenernator.MakeWhereClause("FK_ID = ?")),
+                             foreignKey, extraPtr, BindValues);
 }
 
 ExtraPtr ExtraWeatherDBController::Select(int foreignKey)
 {
-    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS,
-                                                      mQueryGenernator.MakeWhereClause("FK_ID = ?")));
-    stmt.BindInt(1, foreignKey);
-    int rc = stmt.Step();
-    if (rc != SQLITE_ROW)
-    {
-        COMMON_LOG("No result : %d", rc);
-        return nullptr;
-    }
-    return ReadExtra(stmt);
+    return TableQuery::Select(
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS, mQueryGenernator.MakeWhereClause("FK_ID = ?")),
+        foreignKey, ReadExtra);
 }
 
 std::map<int, ExtraPtr> ExtraWeatherDBController::SelectAll()
 {
-    std::map<int, ExtraPtr> extraPtrMap;
-    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"));
-    while (stmt.Step() == SQLITE_ROW)
-        extraPtrMap.emplace(stmt.ColumnInt(28), ReadExtra(stmt));
-    return extraPtrMap;
+    return TableQuery::SelectAllRecords(
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"), 28, ReadExtra);
 }
 
 }  // namespace NSWeather

@@ -1,11 +1,10 @@
 #include "HourlyWeatherDBController.h"
 
-#include <cstdio>
 #include <string>
 
 #include "CommonLog.h"
-#include "DBConnector.h"
 #include "DBStatement.h"
+#include "TableQuery.h"
 
 namespace NSWeather
 {
@@ -64,83 +63,46 @@ HourlyWeatherDBController::~HourlyWeatherDBController()
 
 void HourlyWeatherDBController::CreateTable()
 {
-    char query[1024] = {0};
-    snprintf(query, sizeof(query), CREATE_TABLE_FORMAT, TABLE_NAME);
-    DBConnector::GetInstance()->DBExecuteQuery(query);
+    TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
 }
 
 void HourlyWeatherDBController::DeleteAll()
 {
-    DBConnector::GetInstance()->DBExecuteQuery((std::string("DELETE FROM ") + TABLE_NAME + ";").c_str());
+    TableQuery::DeleteAll(TABLE_NAME);
 }
 
 void HourlyWeatherDBController::Delete(int foreignKey)
 {
-    DBStatement stmt(std::string("DELETE FROM ") + TABLE_NAME + " WHERE FK_ID=?;");
-    stmt.BindInt(1, foreignKey);
-    if (stmt.Step() != SQLITE_DONE)
-        COMMON_LOG("Fail to Delete");
+    TableQuery::Delete(TABLE_NAME, foreignKey);
 }
 
 void HourlyWeatherDBController::Insert(int foreignKey, HourlyPtrVectorPtr hourlyPtrVector)
 {
     COMMON_RET_IF(!hourlyPtrVector);
-    // One prepared statement serves every row.
-    DBStatement stmt(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS));
-    for (size_t i = 0; i < hourlyPtrVector->size(); ++i)
-    {
-        const HourlyPtr& hourlyPtr = hourlyPtrVector->at(i);
-        if (!hourlyPtr)
-            continue;
-        stmt.Reset();
-        stmt.BindInt(1, foreignKey);
-        stmt.BindInt(2, static_cast<int>(i));
-        BindValues(stmt, 3, hourlyPtr);
-        stmt.Step();
-    }
+    TableQuery::InsertList(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS),
+                           foreignKey, *hourlyPtrVector, BindValues);
 }
 
 void HourlyWeatherDBController::Update(int foreignKey, HourlyPtrVectorPtr hourlyPtrVector)
 {
     COMMON_RET_IF(!hourlyPtrVector);
-    DBStatement stmt(mQueryGenernator.MakeUpdateQuery(
-        TABLE_NAME, UPDATE_ASSIGNMENTS, mQueryGenernator.MakeWhereClause("FK_ID = ? AND hourlyIndex = ?;")));
-    for (size_t i = 0; i < hourlyPtrVector->size(); ++i)
-    {
-        const HourlyPtr& hourlyPtr = hourlyPtrVector->at(i);
-        if (!hourlyPtr)
-            continue;
-        stmt.Reset();
-        int next = BindValues(stmt, 1, hourlyPtr);
-        stmt.BindInt(next, foreignKey);
-        stmt.BindInt(next + 1, static_cast<int>(i));
-        stmt.Step();
-    }
+    TableQuery::UpdateList(mQueryGenernator.MakeUpdateQuery(
+                               TABLE_NAME, UPDATE_ASSIGNMENTS,
+                               mQueryGenernator.MakeWhereClause("FK_ID = ? AND hourlyIndex = ?;")),
+                           foreignKey, *hourlyPtrVector, BindValues);
 }
 
 HourlyPtrVectorPtr HourlyWeatherDBController::Select(int foreignKey)
 {
-    HourlyPtrVectorPtr hourlyPtrVector = std::make_shared<HourlyPtrVector>();
-    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS,
-                                                      mQueryGenernator.MakeWhereClause("FK_ID = ?")));
-    stmt.BindInt(1, foreignKey);
-    while (stmt.Step() == SQLITE_ROW)
-        hourlyPtrVector->push_back(ReadHourly(stmt));
-    return hourlyPtrVector;
+    return TableQuery::SelectList(
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS, mQueryGenernator.MakeWhereClause("FK_ID = ?")),
+        foreignKey, ReadHourly);
 }
 
 std::map<int, HourlyPtrVectorPtr> HourlyWeatherDBController::SelectAll()
 {
-    std::map<int, HourlyPtrVectorPtr> listMap;
-    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"));
-    while (stmt.Step() == SQLITE_ROW)
-    {
-        HourlyPtrVectorPtr& list = listMap[stmt.ColumnInt(7)];
-        if (!list)
-            list = std::make_shared<HourlyPtrVector>();
-        list->push_back(ReadHourly(stmt));
-    }
-    return listMap;
+    return TableQuery::SelectAllLists(
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"), 7, ReadHourly);
 }
 
 }  // namespace NSWeather

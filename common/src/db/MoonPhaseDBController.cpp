@@ -1,10 +1,8 @@
 #include "MoonPhaseDBController.h"
 
-#include <cstdio>
-
 #include "CommonLog.h"
-#include "DBConnector.h"
 #include "DBStatement.h"
+#include "TableQuery.h"
 
 namespace NSWeather
 {
@@ -57,22 +55,17 @@ MoonPhaseDBController::~MoonPhaseDBController()
 
 void MoonPhaseDBController::CreateTable()
 {
-    char query[1024] = {0};
-    snprintf(query, sizeof(query), CREATE_TABLE_FORMAT, TABLE_NAME);
-    DBConnector::GetInstance()->DBExecuteQuery(query);
+    TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
 }
 
 void MoonPhaseDBController::DeleteAll()
 {
-    DBConnector::GetInstance()->DBExecuteQuery((std::string("DELETE FROM ") + TABLE_NAME + ";").c_str());
+    TableQuery::DeleteAll(TABLE_NAME);
 }
 
 void MoonPhaseDBController::Delete(int foreignKey)
 {
-    DBStatement stmt(std::string("DELETE FROM ") + TABLE_NAME + " WHERE FK_ID=?;");
-    stmt.BindInt(1, foreignKey);
-    if (stmt.Step() != SQLITE_DONE)
-        COMMON_LOG("Fail to Delete");
+    TableQuery::Delete(TABLE_NAME, foreignKey);
 }
 
 void MoonPhaseDBController::Delete(const std::string& locationId)
@@ -86,47 +79,24 @@ void MoonPhaseDBController::Delete(const std::string& locationId)
 void MoonPhaseDBController::Insert(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector)
 {
     COMMON_RET_IF(!moonPhasePtrVector);
-    DBStatement stmt(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS));
-    for (size_t i = 0; i < moonPhasePtrVector->size(); ++i)
-    {
-        const MoonPhasePtr& moonPhasePtr = moonPhasePtrVector->at(i);
-        if (!moonPhasePtr)
-            continue;
-        stmt.Reset();
-        stmt.BindInt(1, foreignKey);
-        stmt.BindInt(2, static_cast<int>(i));
-        BindValues(stmt, 3, moonPhasePtr);
-        stmt.Step();
-    }
+    TableQuery::InsertList(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS),
+                           foreignKey, *moonPhasePtrVector, BindValues);
 }
 
 void MoonPhaseDBController::Update(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector)
 {
     COMMON_RET_IF(!moonPhasePtrVector);
-    DBStatement stmt(mQueryGenernator.MakeUpdateQuery(
-        TABLE_NAME, UPDATE_ASSIGNMENTS, mQueryGenernator.MakeWhereClause("FK_ID = ? AND moonPhaseIndex = ?;")));
-    for (size_t i = 0; i < moonPhasePtrVector->size(); ++i)
-    {
-        const MoonPhasePtr& moonPhasePtr = moonPhasePtrVector->at(i);
-        if (!moonPhasePtr)
-            continue;
-        stmt.Reset();
-        int next = BindValues(stmt, 1, moonPhasePtr);
-        stmt.BindInt(next, foreignKey);
-        stmt.BindInt(next + 1, static_cast<int>(i));
-        stmt.Step();
-    }
+    TableQuery::UpdateList(mQueryGenernator.MakeUpdateQuery(
+                               TABLE_NAME, UPDATE_ASSIGNMENTS,
+                               mQueryGenernator.MakeWhereClause("FK_ID = ? AND moonPhaseIndex = ?;")),
+                           foreignKey, *moonPhasePtrVector, BindValues);
 }
 
 MoonPhasePtrVectorPtr MoonPhaseDBController::Select(int foreignKey)
 {
-    MoonPhasePtrVectorPtr moonPhasePtrVector = std::make_shared<MoonPhasePtrVector>();
-    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS,
-                                                      mQueryGenernator.MakeWhereClause("FK_ID = ?")));
-    stmt.BindInt(1, foreignKey);
-    while (stmt.Step() == SQLITE_ROW)
-        moonPhasePtrVector->push_back(ReadMoonPhase(stmt));
-    return moonPhasePtrVector;
+    return TableQuery::SelectList(
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS, mQueryGenernator.MakeWhereClause("FK_ID = ?")),
+        foreignKey, ReadMoonPhase);
 }
 
 std::vector<std::string> MoonPhaseDBController::SelectAllLocationId()
@@ -143,16 +113,8 @@ std::vector<std::string> MoonPhaseDBController::SelectAllLocationId()
 
 std::map<int, MoonPhasePtrVectorPtr> MoonPhaseDBController::SelectAll()
 {
-    std::map<int, MoonPhasePtrVectorPtr> listMap;
-    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"));
-    while (stmt.Step() == SQLITE_ROW)
-    {
-        MoonPhasePtrVectorPtr& list = listMap[stmt.ColumnInt(6)];
-        if (!list)
-            list = std::make_shared<MoonPhasePtrVector>();
-        list->push_back(ReadMoonPhase(stmt));
-    }
-    return listMap;
+    return TableQuery::SelectAllLists(
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"), 6, ReadMoonPhase);
 }
 
 }  // namespace NSWeather

@@ -1,11 +1,10 @@
 #include "SettingDBController.h"
 
-#include <cstdio>
-
 #include "CommonLog.h"
 #include "DBConnector.h"
 #include "DBStatement.h"
 #include "FileUtil.h"
+#include "TableQuery.h"
 #include "WeatherDefine.h"
 
 namespace NSWeather
@@ -51,8 +50,6 @@ constexpr const char* SETTING_ASSIGNMENTS =
     "AutoScrollInterval = ?, LastUpdateLanguageCode = ?, CpType = ?, DaemonType = ?, IsNowRefreshing = ?, "
     "IsSupportManualRefresh = ?, RefreshingStartTime = ?";
 
-constexpr size_t CREATE_QUERY_BUFFER_SIZE = 1024;
-
 std::string GetSettingDBFilePath()
 {
     return FileUtil::GetSettingDBFilePath();
@@ -83,21 +80,12 @@ int SettingDBController::Initialize()
 
 bool SettingDBController::IsSettingTableExist()
 {
-    DBStatement statement(mQueryGenernator.MakeSelectQuery(SETTING_TABLE, "COUNT(*)"));
-    int result = statement.Step();
-    if (result != SQLITE_ROW)
-    {
-        COMMON_LOG("No result : %d", result);
-        return false;
-    }
-    return statement.ColumnDouble(0) > 0;
+    return TableQuery::IsTableExist(SETTING_TABLE);
 }
 
 void SettingDBController::CreateTable()
 {
-    char query[CREATE_QUERY_BUFFER_SIZE] = {};
-    snprintf(query, sizeof(query), SETTING_CREATE_FORMAT, SETTING_TABLE);
-    DBConnector::GetInstance()->DBExecuteQuery(query);
+    TableQuery::CreateTable(SETTING_CREATE_FORMAT, SETTING_TABLE);
 }
 
 void SettingDBController::Insert(const SettingPtr& settingPtr)

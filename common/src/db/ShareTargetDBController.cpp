@@ -1,11 +1,10 @@
 #include "ShareTargetDBController.h"
 
-#include <cstdio>
-
 #include "CommonLog.h"
 #include "DBConnector.h"
 #include "DBStatement.h"
 #include "FileUtil.h"
+#include "TableQuery.h"
 #include "WeatherDefine.h"
 
 namespace NSWeather
@@ -20,7 +19,6 @@ constexpr const char* SHARE_TARGET_CREATE_FORMAT =
 constexpr const char* SHARE_TARGET_SELECT_COLUMNS = "AppID,PortID";
 constexpr const char* SHARE_TARGET_INSERT_COLUMNS = "AppID, PortID";
 constexpr const char* SHARE_TARGET_PLACEHOLDERS = "?, ?";
-constexpr size_t CREATE_QUERY_BUFFER_SIZE = 1024;
 
 std::string GetShareTargetDataDBFilePath()
 {
@@ -44,21 +42,12 @@ int ShareTargetDBController::Initialize()
 
 bool ShareTargetDBController::IsShareTargetTableExist()
 {
-    DBStatement statement(mQueryGenernator.MakeSelectQuery(SHARE_TARGET_TABLE, "COUNT(*)"));
-    int result = statement.Step();
-    if (result != SQLITE_ROW)
-    {
-        COMMON_LOG("No result : %d", result);
-        return false;
-    }
-    return statement.ColumnDouble(0) > 0;
+    return TableQuery::IsTableExist(SHARE_TARGET_TABLE);
 }
 
 void ShareTargetDBController::CreateTable()
 {
-    char query[CREATE_QUERY_BUFFER_SIZE] = {};
-    snprintf(query, sizeof(query), SHARE_TARGET_CREATE_FORMAT, SHARE_TARGET_TABLE);
-    DBConnector::GetInstance()->DBExecuteQuery(query);
+    TableQuery::CreateTable(SHARE_TARGET_CREATE_FORMAT, SHARE_TARGET_TABLE);
 }
 
 void ShareTargetDBController::Insert(const ShareTargetPtr& shareTargetPtr)

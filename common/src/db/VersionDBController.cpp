@@ -1,11 +1,10 @@
 #include "VersionDBController.h"
 
-#include <cstdio>
-
 #include "CommonLog.h"
 #include "DBConnector.h"
 #include "DBStatement.h"
 #include "FileUtil.h"
+#include "TableQuery.h"
 #include "WeatherDefine.h"
 
 namespace NSWeather
@@ -17,7 +16,6 @@ constexpr const char* VERSION_TABLE = "VERSION_TABLE";
 constexpr const char* VERSION_CREATE_FORMAT = "CREATE TABLE IF NOT EXISTS %s (dbVersion DOUBLE);";
 constexpr double LATEST_DB_VERSION = 0.8;
 constexpr double NO_VERSION = -1.0;
-constexpr size_t CREATE_QUERY_BUFFER_SIZE = 1024;
 
 std::string GetVersionDBFilePath()
 {
@@ -91,9 +89,7 @@ bool VersionDBController::UpgradeDB(double version)
 
 void VersionDBController::CreateTable()
 {
-    char query[CREATE_QUERY_BUFFER_SIZE] = {};
-    snprintf(query, sizeof(query), VERSION_CREATE_FORMAT, VERSION_TABLE);
-    DBConnector::GetInstance()->DBExecuteQuery(query);
+    TableQuery::CreateTable(VERSION_CREATE_FORMAT, VERSION_TABLE);
 }
 
 }  // namespace NSWeather

@@ -1,12 +1,11 @@
 #include "WeeklyWeatherDBController.h"
 
-#include <cstdio>
 #include <ctime>
 #include <string>
 
 #include "CommonLog.h"
-#include "DBConnector.h"
 #include "DBStatement.h"
+#include "TableQuery.h"
 
 namespace NSWeather
 {
@@ -74,82 +73,46 @@ WeeklyWeatherDBController::~WeeklyWeatherDBController()
 
 void WeeklyWeatherDBController::CreateTable()
 {
-    char query[1024] = {0};
-    snprintf(query, sizeof(query), CREATE_TABLE_FORMAT, TABLE_NAME);
-    DBConnector::GetInstance()->DBExecuteQuery(query);
+    TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
 }
 
 void WeeklyWeatherDBController::DeleteAll()
 {
-    DBConnector::GetInstance()->DBExecuteQuery((std::string("DELETE FROM ") + TABLE_NAME + ";").c_str());
+    TableQuery::DeleteAll(TABLE_NAME);
 }
 
 void WeeklyWeatherDBController::Delete(int foreignKey)
 {
-    DBStatement stmt(std::string("DELETE FROM ") + TABLE_NAME + " WHERE FK_ID=?;");
-    stmt.BindInt(1, foreignKey);
-    if (stmt.Step() != SQLITE_DONE)
-        COMMON_LOG("Fail to Delete");
+    TableQuery::Delete(TABLE_NAME, foreignKey);
 }
 
 void WeeklyWeatherDBController::Insert(int foreignKey, WeeklyPtrVectorPtr weeklyPtrVector)
 {
     COMMON_RET_IF(!weeklyPtrVector);
-    DBStatement stmt(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS));
-    for (size_t i = 0; i < weeklyPtrVector->size(); ++i)
-    {
-        const WeeklyPtr& weeklyPtr = weeklyPtrVector->at(i);
-        if (!weeklyPtr)
-            continue;
-        stmt.Reset();
-        stmt.BindInt(1, foreignKey);
-        stmt.BindInt(2, static_cast<int>(i));
-        BindValues(stmt, 3, weeklyPtr);
-        stmt.Step();
-    }
+    TableQuery::InsertList(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS),
+                           foreignKey, *weeklyPtrVector, BindValues);
 }
 
 void WeeklyWeatherDBController::Update(int foreignKey, WeeklyPtrVectorPtr weeklyPtrVector)
 {
     COMMON_RET_IF(!weeklyPtrVector);
-    DBStatement stmt(mQueryGenernator.MakeUpdateQuery(
-        TABLE_NAME, UPDATE_ASSIGNMENTS, mQueryGenernator.MakeWhereClause("FK_ID = ? AND weeklyIndex = ?;")));
-    for (size_t i = 0; i < weeklyPtrVector->size(); ++i)
-    {
-        const WeeklyPtr& weeklyPtr = weeklyPtrVector->at(i);
-        if (!weeklyPtr)
-            continue;
-        stmt.Reset();
-        int next = BindValues(stmt, 1, weeklyPtr);
-        stmt.BindInt(next, foreignKey);
-        stmt.BindInt(next + 1, static_cast<int>(i));
-        stmt.Step();
-    }
+    TableQuery::UpdateList(mQueryGenernator.MakeUpdateQuery(
+                               TABLE_NAME, UPDATE_ASSIGNMENTS,
+                               mQueryGenernator.MakeWhereClause("FK_ID = ? AND weeklyIndex = ?;")),
+                           foreignKey, *weeklyPtrVector, BindValues);
 }
 
 WeeklyPtrVectorPtr WeeklyWeatherDBController::Select(int foreignKey)
 {
-    WeeklyPtrVectorPtr weeklyPtrVector = std::make_shared<WeeklyPtrVector>();
-    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS,
-                                                      mQueryGenernator.MakeWhereClause("FK_ID = ?")));
-    stmt.BindInt(1, foreignKey);
-    while (stmt.Step() == SQLITE_ROW)
-        weeklyPtrVector->push_back(ReadWeekly(stmt));
-    return weeklyPtrVector;
+    return TableQuery::SelectList(
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS, mQueryGenernator.MakeWhereClause("FK_ID = ?")),
+        foreignKey, ReadWeekly);
 }
 
 std::map<int, WeeklyPtrVectorPtr> WeeklyWeatherDBController::SelectAll()
 {
-    std::map<int, WeeklyPtrVectorPtr> listMap;
-    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"));
-    while (stmt.Step() == SQLITE_ROW)
-    {
-        WeeklyPtrVectorPtr& list = listMap[stmt.ColumnInt(7)];
-        if (!list)
-            list = std::make_shared<WeeklyPtrVector>();
-        list->push_back(ReadWeekly(stmt));
-    }
-    return listMap;
+    return TableQuery::SelectAllLists(
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"), 7, ReadWeekly);
 }
 
 }  // namespace NSWeather
