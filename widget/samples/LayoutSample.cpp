@@ -4,8 +4,12 @@
 
 #include <cstdio>
 
+#include "ViewBasicElements.h"
+
 namespace NSWeatherWidget
 {
+
+using NSWeather::ViewBasicElements;
 
 namespace
 {
@@ -55,17 +59,11 @@ const SampleCity kCities[] = {
      {{"Mon", 2, "17", "10"}, {"Tue", 1, "19", "11"}, {"Wed", 8, "15", "11"}, {"Thu", 6, "14", "9"}}},
 };
 
-const char* const kIconStems[] = {
-    "01.weather_view_sunny",         "01.weather_view_sunny",
-    "02.weather_view_partly_sunny",  "03.weather_view_cloudy",
-    "04.weather_view_rain",          "05.weather_view_fog",
-    "06.weather_view_shower",        "07.weather_view_partly_sunny_with_shower",
-    "08.weather_view_thunderstorms", "09.weather_view_partly_sunny_with_thunder_showers",
-    "10.weather_view_flurries",      "11.weather_view_partly_sunny_with_flurries",
-    "12.weather_view_snow",          "13.weather_view_rain_and_snow_mixed",
-    "14.weather_view_ice",           "15.weather_view_hot",
-    "16.weather_view_cold",          "17.weather_view_windy",
-    "18.weather_view_clear",         "19.weather_view_mostly_clear"};
+// View types of the image names: the current weather of a 4x4 or 4x2
+// page, and a day of the forecast.
+const int kViewType4x4 = 6;
+const int kViewType4x2 = 5;
+const int kViewTypeDay = 4;
 
 const char* Tr(const char* id)
 {
@@ -200,10 +198,11 @@ bool LayoutSample::FillToday(Evas_Object* city, PageState state, int cityIndex)
     elm_object_part_text_set(city, "localTime", sample.localTime);
     if (current)
         elm_object_signal_emit(city, "receiver,invisible,localtime", "localTime");
-    int size = mIs4x4 ? 196 : 154;
+    const std::string icon = ViewBasicElements::MakeWeatherIconName(TodayViewType(), sample.code, false);
+    const std::string iconPress = ViewBasicElements::MakeWeatherIconName(TodayViewType(), sample.code, true);
     elm_object_part_text_set(today, "current", sample.temperature);
-    return SetContent(today, "icon", Image(today, IconName(sample.code, size, false))) &&
-           SetContent(today, "iconPress", Image(today, IconName(sample.code, size, true))) &&
+    return SetContent(today, "icon", Image(today, icon)) &&
+           SetContent(today, "iconPress", Image(today, iconPress)) &&
            SetContent(today, "currentUnit", Image(today, UnitName(false))) &&
            SetContent(today, "currentUnitPress", Image(today, UnitName(true)));
 }
@@ -243,10 +242,10 @@ bool LayoutSample::FillForecast(Evas_Object* city, int cityIndex)
                                  (day.high + degree).c_str());
         elm_object_part_text_set(forecast, ("weatherForecastLowTemp" + n).c_str(),
                                  (day.low + degree).c_str());
-        if (!SetContent(forecast, ("weatherForecastIcon" + n).c_str(),
-                        Image(forecast, IconName(day.code, 96, false))) ||
-            !SetContent(forecast, ("weatherForecastPressIcon" + n).c_str(),
-                        Image(forecast, IconName(day.code, 96, true))))
+        const std::string icon = ViewBasicElements::MakeWeatherIconName(kViewTypeDay, day.code, false);
+        const std::string iconPress = ViewBasicElements::MakeWeatherIconName(kViewTypeDay, day.code, true);
+        if (!SetContent(forecast, ("weatherForecastIcon" + n).c_str(), Image(forecast, icon)) ||
+            !SetContent(forecast, ("weatherForecastPressIcon" + n).c_str(), Image(forecast, iconPress)))
             return false;
     }
     return true;
@@ -287,18 +286,14 @@ Evas_Object* LayoutSample::Image(Evas_Object* parent, const std::string& name)
     return image;
 }
 
-std::string LayoutSample::IconName(int code, int size, bool pressed) const
+int LayoutSample::TodayViewType() const
 {
-    const int count = static_cast<int>(sizeof(kIconStems) / sizeof(kIconStems[0]));
-    std::string stem = (code >= 0 && code < count) ? kIconStems[code] : kIconStems[1];
-    std::string side = std::to_string(size);
-    return stem + (pressed ? "_press_" : "_") + side + "x" + side + ".png";
+    return mIs4x4 ? kViewType4x4 : kViewType4x2;
 }
 
 std::string LayoutSample::UnitName(bool pressed) const
 {
-    return std::string("weather_widget_") + (mIs4x4 ? "4x4" : "4x2") + "_temp_c" + (pressed ? "_press" : "") +
-           ".png";
+    return ViewBasicElements::MakeTemperatureUnitIconName(TodayViewType(), true, pressed);
 }
 
 }  // namespace NSWeatherWidget

@@ -44,7 +44,7 @@ private:
     Evas_Object* Layout(Evas_Object* parent, const std::string& file, const char* group);
     Evas_Object* PageLayout(Evas_Object* parent, const char* group);
     Evas_Object* Image(Evas_Object* parent, const std::string& name);
-    std::string IconName(int code, int size, bool pressed) const;
+    int TodayViewType() const;
     std::string UnitName(bool pressed) const;
 
     std::string mResDir;
