@@ -10,9 +10,10 @@
 namespace
 {
 
-void Usage()
+void Usage(FILE* out)
 {
-    fprintf(stderr, "usage: msgport-send <app id> <port> [key=value ...]\n");
+    fprintf(out, "usage: msgport-send <app id> <port> [key=value ...]\n"
+                 "       msgport-send --help\n");
 }
 
 const char* ErrorName(int error)
@@ -58,9 +59,14 @@ bool AddPairs(bundle* message, int count, char** pairs)
 
 int main(int argc, char** argv)
 {
+    if (argc == 2 && (strcmp(argv[1], "--help") == 0 || strcmp(argv[1], "-h") == 0))
+    {
+        Usage(stdout);
+        return 0;
+    }
     if (argc < 3)
     {
-        Usage();
+        Usage(stderr);
         return 2;
     }
     bundle* message = bundle_create();

@@ -26,12 +26,13 @@ struct Options
     std::string resDir;
     std::string browser = "/bin/true";
     bool reset = false;
+    bool help = false;
 };
 
-void Usage()
+void Usage(FILE* out)
 {
-    fprintf(stderr,
-            "usage: platform-setup [--root DIR] [--app PROGRAM] [--agent PROGRAM] [--widget PROGRAM]\n"
+    fprintf(out,
+            "usage: platform-setup [--help] [--root DIR] [--app PROGRAM] [--agent PROGRAM] [--widget PROGRAM]\n"
             "                      [--res BUILD_RES_DIR] [--browser PROGRAM] [--reset]\n"
             "Keys that exist are kept unless --reset is given.\n");
 }
@@ -42,9 +43,10 @@ bool ParseOptions(int argc, char** argv, Options& options)
         {"root", required_argument, nullptr, 'r'},  {"app", required_argument, nullptr, 'a'},
         {"agent", required_argument, nullptr, 'g'}, {"widget", required_argument, nullptr, 'w'},
         {"res", required_argument, nullptr, 's'},   {"browser", required_argument, nullptr, 'b'},
-        {"reset", no_argument, nullptr, 'x'},       {nullptr, 0, nullptr, 0}};
+        {"reset", no_argument, nullptr, 'x'},       {"help", no_argument, nullptr, 'h'},
+        {nullptr, 0, nullptr, 0}};
     int c;
-    while ((c = getopt_long(argc, argv, "", kOptions, nullptr)) != -1)
+    while ((c = getopt_long(argc, argv, "h", kOptions, nullptr)) != -1)
     {
         switch (c)
         {
@@ -68,6 +70,9 @@ bool ParseOptions(int argc, char** argv, Options& options)
                 break;
             case 'x':
                 options.reset = true;
+                break;
+            case 'h':
+                options.help = true;
                 break;
             default:
                 return false;
@@ -199,8 +204,13 @@ int main(int argc, char** argv)
     Options options;
     if (!ParseOptions(argc, argv, options))
     {
-        Usage();
+        Usage(stderr);
         return 2;
+    }
+    if (options.help)
+    {
+        Usage(stdout);
+        return 0;
     }
     std::string root = platform::RootDir();
     for (const char* sub : {"apps", "log", "run"})

@@ -2,6 +2,7 @@
 //   vconftool set -t int|bool|double|string <key> <value>
 //   vconftool get <key>
 //   vconftool watch <key> [count]
+//   vconftool --help
 
 #include <Ecore.h>
 
@@ -20,12 +21,18 @@ namespace
 
 int gRemaining = -1;
 
-int Usage()
+void PrintUsage(FILE* out)
 {
-    fprintf(stderr,
+    fprintf(out,
             "usage: vconftool set -t int|bool|double|string <key> <value>\n"
             "       vconftool get <key>\n"
-            "       vconftool watch <key> [count]\n");
+            "       vconftool watch <key> [count]\n"
+            "       vconftool --help\n");
+}
+
+int Usage()
+{
+    PrintUsage(stderr);
     return 2;
 }
 
@@ -132,6 +139,11 @@ int main(int argc, char** argv)
     if (argc < 2)
         return Usage();
     std::string command = argv[1];
+    if (command == "--help" || command == "-h")
+    {
+        PrintUsage(stdout);
+        return 0;
+    }
     if (command == "set")
         return Set(argc, argv);
     if (command == "get")

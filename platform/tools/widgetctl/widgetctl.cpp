@@ -25,20 +25,31 @@ std::string Absolute(const std::string& path)
     return std::string(cwd) + "/" + path;
 }
 
-int Usage()
+void PrintUsage(FILE* out)
 {
-    fprintf(stderr,
+    fprintf(out,
             "usage: widgetctl [--widget-id ID] <command> [args]\n"
+            "       widgetctl --help\n"
             "commands: create <4x2|4x4> | resize <id> <4x2|4x4> | pause <id> | resume <id>\n"
             "  | update <id> [force] | destroy <id> | list | tap <id> <x> <y> [ms]\n"
             "  | swipe <id> <x1> <y1> <x2> <y2> <ms> | snapshot <id> <file.png> | dump <id>\n"
             "  | idle [seconds] | event <language|region|low-battery|low-memory> | exit\n");
+}
+
+int Usage()
+{
+    PrintUsage(stderr);
     return 1;
 }
 }  // namespace
 
 int main(int argc, char** argv)
 {
+    if (argc == 2 && (strcmp(argv[1], "--help") == 0 || strcmp(argv[1], "-h") == 0))
+    {
+        PrintUsage(stdout);
+        return 0;
+    }
     std::string widgetId = kDefaultWidgetId;
     int first = 1;
     if (argc > 2 && strcmp(argv[1], "--widget-id") == 0)
