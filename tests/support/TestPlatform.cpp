@@ -1,6 +1,7 @@
 #include "TestPlatform.h"
 
 #include <cstdlib>
+#include <fstream>
 #include <stdexcept>
 #include <ftw.h>
 #include <sys/stat.h>
@@ -76,6 +77,12 @@ void TestPlatformRoot::RegisterApp(const std::string& appId) const
     MakeDirs(dir + "/shared/data");
     MakeDirs(dir + "/shared/res");
     MakeDirs(dir + "/res");
+}
+
+void TestPlatformRoot::RegisterApp(const std::string& appId, const std::string& conf) const
+{
+    RegisterApp(appId);
+    std::ofstream(Path("apps/" + appId + "/app.conf")) << conf;
 }
 
 void TestPlatformRoot::UseBuildResources() const

@@ -28,6 +28,8 @@ public:
     // "<root>/apps/com.quorvex.weather-m/shared/data/"
     std::string SharedDataDir() const;
     void RegisterApp(const std::string& appId) const;
+    // Registers the application with `conf` as its app.conf.
+    void RegisterApp(const std::string& appId, const std::string& conf) const;
     // Points each suite application's res/ and shared/res/ at the build
     // tree's resource folders (<build>/res/<app id>/...), as an install would.
     void UseBuildResources() const;

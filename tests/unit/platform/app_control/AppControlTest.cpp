@@ -7,72 +7,16 @@
 
 #include <cstdlib>
 #include <fstream>
-#include <functional>
-#include <sstream>
 #include <string>
 #include <vector>
 
+#include "TestFiles.h"
 #include "TestPlatform.h"
 
 namespace
 {
 
 const char* const kRecorderId = "test.recorder";
-
-std::string ReadText(const std::string& path)
-{
-    std::ifstream file(path);
-    std::stringstream content;
-    content << file.rdbuf();
-    return content.str();
-}
-
-std::vector<std::string> Lines(const std::string& text)
-{
-    std::vector<std::string> lines;
-    std::stringstream stream(text);
-    std::string line;
-    while (std::getline(stream, line)) lines.push_back(line);
-    return lines;
-}
-
-// Runs the main loop until `done` holds or `seconds` pass.
-bool RunLoopUntil(const std::function<bool()>& done, double seconds)
-{
-    struct State
-    {
-        const std::function<bool()>* done;
-        bool met = false;
-    } state{&done};
-    Ecore_Timer* poll = ecore_timer_add(
-        0.02,
-        [](void* data) -> Eina_Bool
-        {
-            auto* s = static_cast<State*>(data);
-            if ((*s->done)())
-            {
-                s->met = true;
-                ecore_main_loop_quit();
-            }
-            return ECORE_CALLBACK_RENEW;
-        },
-        &state);
-    Ecore_Timer* timeout = ecore_timer_add(
-        seconds,
-        [](void*) -> Eina_Bool
-        {
-            ecore_main_loop_quit();
-            return ECORE_CALLBACK_CANCEL;
-        },
-        nullptr);
-    ecore_main_loop_begin();
-    ecore_timer_del(poll);
-    if (!state.met)
-        timeout = nullptr;
-    else
-        ecore_timer_del(timeout);
-    return state.met || done();
-}
 
 class AppControlTest : public WeatherTest::PlatformTest
 {
@@ -89,11 +33,7 @@ protected:
         ecore_shutdown();
     }
 
-    void Register(const std::string& appId, const std::string& conf) const
-    {
-        mRoot.RegisterApp(appId);
-        std::ofstream(mRoot.Path("apps/" + appId + "/app.conf")) << conf;
-    }
+    void Register(const std::string& appId, const std::string& conf) const { mRoot.RegisterApp(appId, conf); }
 
     std::string RecordPath(const std::string& appId = kRecorderId) const
     {
@@ -103,12 +43,14 @@ protected:
     std::vector<std::string> WaitForRecord(const std::string& appId = kRecorderId) const
     {
         std::string path = RecordPath(appId);
-        struct stat st;
-        EXPECT_TRUE(RunLoopUntil([&path, &st] { return stat(path.c_str(), &st) == 0; }, 10.0));
-        return Lines(ReadText(path));
+        EXPECT_TRUE(WeatherTest::WaitForFile(path, 10.0));
+        return WeatherTest::ReadLines(path);
     }
 
-    std::vector<std::string> LaunchLog() const { return Lines(ReadText(mRoot.Path("log/launch.log"))); }
+    std::vector<std::string> LaunchLog() const
+    {
+        return WeatherTest::ReadLines(mRoot.Path("log/launch.log"));
+    }
 
     app_control_h mRequest = nullptr;
 };

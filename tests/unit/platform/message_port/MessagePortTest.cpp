@@ -15,6 +15,7 @@
 #include <utility>
 #include <vector>
 
+#include "MainLoop.h"
 #include "TestPlatform.h"
 #include "message_port/MessageEnvelope.h"
 
@@ -51,35 +52,10 @@ void MessageCb(int portId, const char* remoteAppId, const char* remotePort, bool
     static_cast<std::vector<Received>*>(data)->push_back(received);
 }
 
-// Quits the loop after `seconds`, or earlier once `count` messages are in.
+// Runs the loop until `count` messages are in, or `seconds` pass.
 void RunLoop(const std::vector<Received>& received, size_t count, double seconds)
 {
-    struct State
-    {
-        const std::vector<Received>* received;
-        size_t count;
-    } state{&received, count};
-    Ecore_Timer* poll = ecore_timer_add(
-        0.01,
-        [](void* data) -> Eina_Bool
-        {
-            auto* s = static_cast<State*>(data);
-            if (s->received->size() >= s->count)
-                ecore_main_loop_quit();
-            return ECORE_CALLBACK_RENEW;
-        },
-        &state);
-    Ecore_Timer* timeout = ecore_timer_add(
-        seconds,
-        [](void*) -> Eina_Bool
-        {
-            ecore_main_loop_quit();
-            return ECORE_CALLBACK_RENEW;
-        },
-        nullptr);
-    ecore_main_loop_begin();
-    ecore_timer_del(poll);
-    ecore_timer_del(timeout);
+    WeatherTest::RunLoopUntil([&received, count] { return received.size() >= count; }, seconds);
 }
 
 class MessagePortTest : public WeatherTest::PlatformTest

@@ -3,11 +3,11 @@
 #include <Ecore.h>
 #include <gtest/gtest.h>
 
-#include <fstream>
-#include <sstream>
 #include <string>
 #include <vector>
 
+#include "MainLoop.h"
+#include "TestFiles.h"
 #include "TestPlatform.h"
 
 namespace
@@ -22,20 +22,6 @@ struct Completion
 void CompletedCb(int requestId, const char* uri, void* data)
 {
     static_cast<std::vector<Completion>*>(data)->push_back({requestId, uri});
-}
-
-// Runs the main loop for one short moment: jobs and idlers get their turn.
-void Spin(double seconds)
-{
-    ecore_timer_add(
-        seconds,
-        [](void*) -> Eina_Bool
-        {
-            ecore_main_loop_quit();
-            return ECORE_CALLBACK_CANCEL;
-        },
-        nullptr);
-    ecore_main_loop_begin();
 }
 
 class UsageLogClientTest : public WeatherTest::PlatformTest
@@ -56,14 +42,7 @@ protected:
         ecore_shutdown();
     }
 
-    std::vector<std::string> Records() const
-    {
-        std::ifstream file(mRoot.Path("log/usage.log"));
-        std::vector<std::string> lines;
-        std::string line;
-        while (std::getline(file, line)) lines.push_back(line);
-        return lines;
-    }
+    std::vector<std::string> Records() const { return WeatherTest::ReadLines(mRoot.Path("log/usage.log")); }
 
     quorvex_log_manager_h mManager = nullptr;
     bundle* mData = nullptr;
@@ -87,7 +66,7 @@ TEST_F(UsageLogClientTest, RecordIsStoredAndCompletionArrivesOnTheLoop)
                   "\"extra\":\"say \\\"hi\\\"\"}}",
               records[0]);
 
-    Spin(0.05);
+    WeatherTest::RunLoopFor(0.05);
     ASSERT_EQ(2u, mCompleted.size());
     EXPECT_EQ(first, mCompleted[0].requestId);
     EXPECT_EQ("content://a/log/x", mCompleted[0].uri);
@@ -106,7 +85,7 @@ TEST_F(UsageLogClientTest, EmptyUriOrRecordIsRefused)
     EXPECT_EQ(QUORVEX_LOG_MANAGER_ERROR_INVALID_PARAMETER,
               quorvex_log_manager_insert(mManager, "content://a", nullptr, nullptr, nullptr));
     EXPECT_TRUE(mLog.Contains("rejected a record", "USAGE_LOG"));
-    Spin(0.05);
+    WeatherTest::RunLoopFor(0.05);
     EXPECT_TRUE(Records().empty());
     EXPECT_TRUE(mCompleted.empty());
 }
@@ -118,7 +97,7 @@ TEST_F(UsageLogClientTest, DestroyDropsPendingCompletions)
     ASSERT_GT(quorvex_log_manager_insert(mManager, "content://a", mData, nullptr, nullptr), 0);
     EXPECT_EQ(QUORVEX_LOG_MANAGER_ERROR_NONE, quorvex_log_manager_destroy(mManager));
     mManager = nullptr;
-    Spin(0.05);
+    WeatherTest::RunLoopFor(0.05);
     EXPECT_TRUE(mCompleted.empty());
     EXPECT_EQ(2u, Records().size());
 }
@@ -132,7 +111,7 @@ TEST_F(UsageLogClientTest, UnwritableLogIsAnIoError)
     EXPECT_EQ(QUORVEX_LOG_MANAGER_ERROR_IO_ERROR,
               quorvex_log_manager_insert(mManager, "content://a", mData, CompletedCb, &mCompleted));
     EXPECT_TRUE(mLog.Contains("cannot write the usage log", "USAGE_LOG"));
-    Spin(0.05);
+    WeatherTest::RunLoopFor(0.05);
     EXPECT_TRUE(mCompleted.empty());
 }
 

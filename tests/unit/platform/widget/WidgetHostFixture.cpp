@@ -3,11 +3,12 @@
 #include <chrono>
 #include <csignal>
 #include <fcntl.h>
-#include <fstream>
 #include <sstream>
 #include <sys/wait.h>
 #include <thread>
 #include <unistd.h>
+
+#include "TestFiles.h"
 
 namespace WeatherTest
 {
@@ -190,12 +191,7 @@ void WidgetHostTest::StopHost()
 
 std::vector<std::string> WidgetHostTest::Records() const
 {
-    std::vector<std::string> lines;
-    std::ifstream file(mRoot.Path("record.log"));
-    std::string line;
-    while (std::getline(file, line))
-        lines.push_back(line);
-    return lines;
+    return ReadLines(mRoot.Path("record.log"));
 }
 
 std::vector<std::string> WidgetHostTest::Records(const std::string& prefix) const

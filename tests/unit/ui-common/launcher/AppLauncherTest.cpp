@@ -4,12 +4,12 @@
 #include <gtest/gtest.h>
 
 #include <cstdio>
-#include <fstream>
 #include <functional>
 #include <string>
 #include <vector>
 
 #include "QuorvexLogManager.h"
+#include "TestFiles.h"
 #include "TestPlatform.h"
 
 using NSWeather::AppLauncher;
@@ -67,18 +67,12 @@ protected:
 
     void TearDown() override { NSWeather::QuorvexLogManager::GetInstance()->Destroy(); }
 
-    void Register(const std::string& appId, const std::string& conf) const
-    {
-        mRoot.RegisterApp(appId);
-        std::ofstream(mRoot.Path("apps/" + appId + "/app.conf")) << conf;
-    }
+    void Register(const std::string& appId, const std::string& conf) const { mRoot.RegisterApp(appId, conf); }
 
     std::vector<Launch> Launches() const
     {
-        std::ifstream file(mRoot.Path("log/launch.log"));
         std::vector<Launch> launches;
-        std::string line;
-        while (std::getline(file, line))
+        for (const std::string& line : WeatherTest::ReadLines(mRoot.Path("log/launch.log")))
             launches.push_back({Field(line, "app_id", '"'), Field(line, "operation", '"'),
                                 Field(line, "uri", '"'), Field(line, "extra", '}')});
         return launches;
@@ -86,10 +80,8 @@ protected:
 
     int UsageRecords() const
     {
-        std::ifstream file(mRoot.Path("log/usage.log"));
         int count = 0;
-        std::string line;
-        while (std::getline(file, line))
+        for (const std::string& line : WeatherTest::ReadLines(mRoot.Path("log/usage.log")))
             count += line.find("\"extra\":\"enter_accuweather\"") != std::string::npos;
         return count;
     }

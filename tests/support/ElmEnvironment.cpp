@@ -1,4 +1,5 @@
 // Elementary is initialised once for the whole test binary, headless.
+// Test binaries that make widgets link the weather-test-elm objects.
 #include <Elementary.h>
 #include <gtest/gtest.h>
 
@@ -11,9 +12,6 @@ class ElmEnvironment : public ::testing::Environment
 public:
     void SetUp() override
     {
-        // CTest does not always pass the build folder on; the tests that
-        // read built resources need it.
-        setenv("WEATHER_BUILD_DIR", WEATHER_TEST_BUILD_DIR, 0);
         setenv("ELM_ENGINE", "buffer", 1);
         ASSERT_GT(elm_init(0, nullptr), 0);
     }

@@ -1,0 +1,22 @@
+#ifndef WEATHER_TESTS_TEST_FILES_H
+#define WEATHER_TESTS_TEST_FILES_H
+
+#include <string>
+#include <vector>
+
+namespace WeatherTest
+{
+
+// The whole file; empty when it cannot be read.
+std::string ReadText(const std::string& path);
+
+// The file's lines without their line ends; none when it cannot be read.
+std::vector<std::string> ReadLines(const std::string& path);
+
+// Runs the Ecore main loop until `path` exists or `timeoutSeconds` pass;
+// true when it exists.
+bool WaitForFile(const std::string& path, double timeoutSeconds);
+
+}  // namespace WeatherTest
+
+#endif
