@@ -48,6 +48,13 @@ private:
 };
 }  // namespace
 
+// Opens the weather database for the rest of the calling operation. A
+// failed open is logged as that operation's guard and returns failValue.
+#define WEATHER_DB_CYCLE_OR_RETURN(isReadOnly, failValue)                                             \
+    DBConnector* dbConnector = DBConnector::GetInstance();                                            \
+    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), isReadOnly) == false, failValue); \
+    CycleCloser cycle(dbConnector)
+
 DBController::DBController()
 {
 }
@@ -58,9 +65,7 @@ DBController::~DBController()
 
 int DBController::Initialize()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController().CreateTable();
     CurrentWeatherDBController().CreateTable();
     WeeklyWeatherDBController().CreateTable();
@@ -131,18 +136,14 @@ CityPtrVectorPtr DBController::SelectAllCities(CityDBController& cityDBControlle
 
 CityPtrVectorPtr DBController::SelectAllCityData()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, nullptr);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(true, nullptr);
     CityDBController cityDBController;
     return SelectAllCities(cityDBController);
 }
 
 CityPtr DBController::SelectCityData(int pageIndex)
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, nullptr);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(true, nullptr);
     CityDBController cityDBController;
     return SelectDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(pageIndex));
 }
@@ -150,18 +151,14 @@ CityPtr DBController::SelectCityData(int pageIndex)
 CityPtr DBController::SelectCityData(const std::string& locationID)
 {
     COMMON_RETV_IF(locationID.length() < 1, nullptr);
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, nullptr);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(true, nullptr);
     CityDBController cityDBController;
     return SelectDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(locationID));
 }
 
 StringVectorPtr DBController::SelectAllLocationIDData()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, nullptr);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(true, nullptr);
     CityDBController cityDBController;
     StringVectorPtr locationIdVector = std::make_shared<StringVector>();
     int count = cityDBController.GetNumberOfCities();
@@ -172,9 +169,7 @@ StringVectorPtr DBController::SelectAllLocationIDData()
 
 StringVectorPtr DBController::SelectNeedToUpdateLocationIDData()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, nullptr);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(true, nullptr);
     CityDBController cityDBController;
     StringVectorPtr locationIdVector = std::make_shared<StringVector>();
     int count = cityDBController.GetNumberOfCities();
@@ -190,41 +185,31 @@ StringVectorPtr DBController::SelectNeedToUpdateLocationIDData()
 
 int DBController::GetNumberOfCities()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, -1);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(true, -1);
     return CityDBController().GetNumberOfCities();
 }
 
 int DBController::GetPageIndexOfCurrentCity()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, -1);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(true, -1);
     return CityDBController().GetPageIndexOfCurrentCity();
 }
 
 int DBController::GetPageIndexWithLocationID(const std::string& locationID)
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, -1);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(true, -1);
     return CityDBController().GetPageIndexWithLocationID(locationID);
 }
 
 std::string DBController::GetLocationIdOfCurrentCity()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, std::string());
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(true, std::string());
     return CityDBController().GetLocationIdOfCurrentCity();
 }
 
 bool DBController::IsCurrentLocationExist()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false, false);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(true, false);
     return CityDBController().IsCurrentLocationExist();
 }
 
@@ -265,9 +250,7 @@ void DBController::InsertDataWithCityPtr(CityDBController& cityDBController, Cit
 int DBController::InsertCityData(CityPtr cityPtr)
 {
     COMMON_RETV_IF(!cityPtr, ERR_FAIL);
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController cityDBController;
     return InsertIfNew(cityDBController, cityPtr) ? ERR_OK : ERR_FAIL;
 }
@@ -298,18 +281,14 @@ bool DBController::UpdateDataWithCityPtr(CityDBController& cityDBController, Cit
 int DBController::UpdateCityData(CityPtr cityPtr)
 {
     COMMON_RETV_IF(!cityPtr, ERR_FAIL);
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController cityDBController;
     return UpdateDataWithCityPtr(cityDBController, cityPtr) ? ERR_OK : ERR_FAIL;
 }
 
 int DBController::UpdateOnlyWidgetReferenceCount(const std::string& locationID, bool isIncrease)
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController cityDBController;
     CityPtr cityPtr = cityDBController.Select(locationID);
     COMMON_RETV_IF(!cityPtr, ERR_FAIL);
@@ -322,9 +301,7 @@ int DBController::UpdateOnlyWidgetReferenceCount(const std::string& locationID, 
 int DBController::UpdateOnlyMobileLink(CityPtr cityPtr)
 {
     COMMON_RETV_IF(!cityPtr, ERR_FAIL);
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController cityDBController;
     int primaryKey = cityDBController.GetPrimaryKey(ResolvePageIndex(cityDBController, cityPtr));
     cityDBController.UpdateOnlyMobileLink(cityPtr, primaryKey);
@@ -334,9 +311,7 @@ int DBController::UpdateOnlyMobileLink(CityPtr cityPtr)
 int DBController::ReorderCityData(CityPtrVectorPtr reorderPtrVector)
 {
     COMMON_RETV_IF(!reorderPtrVector, ERR_FAIL);
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController().Reorder(reorderPtrVector);
     return ERR_OK;
 }
@@ -352,9 +327,7 @@ void DBController::DeleteDataWithPrimaryKey(CityDBController& cityDBController, 
 
 int DBController::DeleteCityData(int pageIndex)
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController cityDBController;
     DeleteDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(pageIndex));
     return ERR_OK;
@@ -362,9 +335,7 @@ int DBController::DeleteCityData(int pageIndex)
 
 int DBController::DeleteCityData(const std::string& locationID)
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController cityDBController;
     DeleteDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(locationID));
     return ERR_OK;
@@ -382,9 +353,7 @@ void DBController::DeleteAll(CityDBController& cityDBController)
 
 int DBController::DeleteAllCityData()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController cityDBController;
     DeleteAll(cityDBController);
     return ERR_OK;
@@ -392,9 +361,7 @@ int DBController::DeleteAllCityData()
 
 int DBController::DeleteAllCityDataAndInsertCityPtrVector(CityPtrVectorPtr cityPtrVector)
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController cityDBController;
     DeleteAll(cityDBController);
     if (!cityPtrVector)
@@ -410,9 +377,7 @@ int DBController::DeleteAllCityDataAndInsertCityPtrVector(CityPtrVectorPtr cityP
 int DBController::UpdateOnlyMoonPhaseData(CityPtr cityPtr)
 {
     COMMON_RETV_IF(!cityPtr, ERR_FAIL);
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController cityDBController;
     int primaryKey = cityDBController.GetPrimaryKey(ResolvePageIndex(cityDBController, cityPtr));
     COMMON_RETV_IF(primaryKey < 1, ERR_FAIL);
@@ -424,9 +389,7 @@ int DBController::UpdateOnlyMoonPhaseData(CityPtr cityPtr)
 
 int DBController::DeleteUselessMoonPhaseData()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, ERR_FAIL);
-    CycleCloser cycle(dbConnector);
+    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController cityDBController;
     MoonPhaseDBController moonPhaseDBController;
     StringVector moonPhaseLocIdVector = moonPhaseDBController.SelectAllLocationId();
