@@ -78,7 +78,8 @@ private:
     bool UpdateDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr);
     void DeleteDataWithPrimaryKey(CityDBController& cityDBController, int primaryKey);
     void DeleteAll(CityDBController& cityDBController);
-    int ResolvePageIndex(CityDBController& cityDBController, const CityPtr& cityPtr);
+    // The page index of a city without one is looked up by its location id.
+    int ResolvePrimaryKey(CityDBController& cityDBController, const CityPtr& cityPtr);
 };
 
 using DBControllerPtr = std::shared_ptr<DBController>;

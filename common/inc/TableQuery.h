@@ -83,23 +83,16 @@ public:
         return records;
     }
 
-    // Insert: FK_ID, the index, then the values. Entry i gets index i; null
-    // entries are skipped, and one prepared statement serves every row.
+    // Insert: FK_ID, the index, then the values. Entry i gets index i.
     template <typename Record>
     static void InsertList(const std::string& query, int foreignKey,
                            const std::vector<std::shared_ptr<Record>>& list, Binder<Record> bind)
     {
-        DBStatement stmt(query);
-        for (size_t i = 0; i < list.size(); ++i)
-        {
-            if (!list[i])
-                continue;
-            stmt.Reset();
+        StepEachEntry(query, list, [&](DBStatement& stmt, int index, const std::shared_ptr<Record>& entry) {
             stmt.BindInt(1, foreignKey);
-            stmt.BindInt(2, static_cast<int>(i));
-            bind(stmt, 3, list[i]);
-            stmt.Step();
-        }
+            stmt.BindInt(2, index);
+            bind(stmt, 3, entry);
+        });
     }
 
     // Update: the values, then FK_ID and the index for the WHERE clause.
@@ -107,17 +100,11 @@ public:
     static void UpdateList(const std::string& query, int foreignKey,
                            const std::vector<std::shared_ptr<Record>>& list, Binder<Record> bind)
     {
-        DBStatement stmt(query);
-        for (size_t i = 0; i < list.size(); ++i)
-        {
-            if (!list[i])
-                continue;
-            stmt.Reset();
-            int next = bind(stmt, 1, list[i]);
+        StepEachEntry(query, list, [&](DBStatement& stmt, int index, const std::shared_ptr<Record>& entry) {
+            int next = bind(stmt, 1, entry);
             stmt.BindInt(next, foreignKey);
-            stmt.BindInt(next + 1, static_cast<int>(i));
-            stmt.Step();
-        }
+            stmt.BindInt(next + 1, index);
+        });
     }
 
     // Never null; empty when the city has no rows.
@@ -151,6 +138,23 @@ public:
 
 private:
     TableQuery() = delete;
+
+    // One prepared statement serves every entry; null entries are skipped
+    // and keep their index free.
+    template <typename Record, typename BindEntry>
+    static void StepEachEntry(const std::string& query, const std::vector<std::shared_ptr<Record>>& list,
+                              BindEntry bindEntry)
+    {
+        DBStatement stmt(query);
+        for (size_t i = 0; i < list.size(); ++i)
+        {
+            if (!list[i])
+                continue;
+            stmt.Reset();
+            bindEntry(stmt, static_cast<int>(i), list[i]);
+            stmt.Step();
+        }
+    }
 };
 
 }  // namespace NSWeather

@@ -9,6 +9,7 @@
 #include "CommonLog.h"
 #include "CurrentWeatherDBController.h"
 #include "DBConnector.h"
+#include "DBCycleCloser.h"
 #include "ExtraWeatherDBController.h"
 #include "FileUtil.h"
 #include "HourlyWeatherDBController.h"
@@ -33,27 +34,14 @@ T FindOr(const std::map<int, T>& values, int key, T fallback)
     auto found = values.find(key);
     return found != values.end() ? found->second : fallback;
 }
-
-// Commits and closes the cycle when the operation leaves, on every path.
-class CycleCloser
-{
-public:
-    explicit CycleCloser(DBConnector* dbConnector) : mDBConnector(dbConnector) {}
-    ~CycleCloser() { mDBConnector->DBFinalize(); }
-    CycleCloser(const CycleCloser&) = delete;
-    CycleCloser& operator=(const CycleCloser&) = delete;
-
-private:
-    DBConnector* mDBConnector;
-};
 }  // namespace
 
-// Opens the weather database for the rest of the calling operation. A
-// failed open is logged as that operation's guard and returns failValue.
+// Opens the weather database for the rest of the calling operation (see
+// DBCycleCloser). A failed open is logged as that operation's guard and returns failValue.
 #define WEATHER_DB_CYCLE_OR_RETURN(isReadOnly, failValue)                                             \
     DBConnector* dbConnector = DBConnector::GetInstance();                                            \
     COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), isReadOnly) == false, failValue); \
-    CycleCloser cycle(dbConnector)
+    DBCycleCloser cycle(dbConnector)
 
 DBController::DBController()
 {
@@ -255,17 +243,17 @@ int DBController::InsertCityData(CityPtr cityPtr)
     return InsertIfNew(cityDBController, cityPtr) ? ERR_OK : ERR_FAIL;
 }
 
-int DBController::ResolvePageIndex(CityDBController& cityDBController, const CityPtr& cityPtr)
+int DBController::ResolvePrimaryKey(CityDBController& cityDBController, const CityPtr& cityPtr)
 {
     if (cityPtr->GetPageIndex() < 0)
         cityPtr->SetPageIndex(cityDBController.GetPageIndexWithLocationID(cityPtr->GetLocationId()));
-    return cityPtr->GetPageIndex();
+    return cityDBController.GetPrimaryKey(cityPtr->GetPageIndex());
 }
 
 bool DBController::UpdateDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr)
 {
     COMMON_RETV_IF(!cityPtr, false);
-    int primaryKey = cityDBController.GetPrimaryKey(ResolvePageIndex(cityDBController, cityPtr));
+    int primaryKey = ResolvePrimaryKey(cityDBController, cityPtr);
     // Without a city row the forecast inserts below would leave orphan rows.
     COMMON_RETV_IF(primaryKey < 1, false);
     cityDBController.Update(cityPtr, primaryKey);
@@ -303,7 +291,7 @@ int DBController::UpdateOnlyMobileLink(CityPtr cityPtr)
     COMMON_RETV_IF(!cityPtr, ERR_FAIL);
     WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController cityDBController;
-    int primaryKey = cityDBController.GetPrimaryKey(ResolvePageIndex(cityDBController, cityPtr));
+    int primaryKey = ResolvePrimaryKey(cityDBController, cityPtr);
     cityDBController.UpdateOnlyMobileLink(cityPtr, primaryKey);
     return ERR_OK;
 }
@@ -379,7 +367,7 @@ int DBController::UpdateOnlyMoonPhaseData(CityPtr cityPtr)
     COMMON_RETV_IF(!cityPtr, ERR_FAIL);
     WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
     CityDBController cityDBController;
-    int primaryKey = cityDBController.GetPrimaryKey(ResolvePageIndex(cityDBController, cityPtr));
+    int primaryKey = ResolvePrimaryKey(cityDBController, cityPtr);
     COMMON_RETV_IF(primaryKey < 1, ERR_FAIL);
     MoonPhaseDBController moonPhaseDBController;
     moonPhaseDBController.Delete(cityPtr->GetLocationId());

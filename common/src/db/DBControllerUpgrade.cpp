@@ -9,6 +9,7 @@
 
 #include "CommonLog.h"
 #include "DBConnector.h"
+#include "DBCycleCloser.h"
 #include "FileUtil.h"
 #include "VersionDBController.h"
 #include "WeatherDefine.h"
@@ -77,8 +78,8 @@ bool RunUpgradeStep(const UpgradeStep& step)
     COMMON_LOG("%s : %s", step.logLabel, step.query);
     DBConnector* dbConnector = DBConnector::GetInstance();
     COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, false);
+    DBCycleCloser cycle(dbConnector);
     dbConnector->DBExecuteQuery(step.query);
-    dbConnector->DBFinalize();
     return true;
 }
 

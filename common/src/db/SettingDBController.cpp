@@ -2,6 +2,7 @@
 
 #include "CommonLog.h"
 #include "DBConnector.h"
+#include "DBCycleCloser.h"
 #include "DBStatement.h"
 #include "FileUtil.h"
 #include "TableQuery.h"
@@ -102,33 +103,28 @@ void SettingDBController::Update(const SettingPtr& settingPtr)
     COMMON_RET_IF(!settingPtr);
     DBConnector* dbConnector = DBConnector::GetInstance();
     COMMON_RET_IF(dbConnector->DBInitialize(GetSettingDBFilePath(), false) == false);
-    {
-        DBStatement statement(mQueryGenernator.MakeUpdateQuery(SETTING_TABLE, SETTING_ASSIGNMENTS));
-        BindSetting(statement, settingPtr);
-        statement.Step();
-    }
-    dbConnector->DBFinalize();
+    DBCycleCloser cycle(dbConnector);
+    DBStatement statement(mQueryGenernator.MakeUpdateQuery(SETTING_TABLE, SETTING_ASSIGNMENTS));
+    BindSetting(statement, settingPtr);
+    statement.Step();
 }
 
 void SettingDBController::UpdateLocationIdOfDisplayCity(const std::string& locationId)
 {
     DBConnector* dbConnector = DBConnector::GetInstance();
     COMMON_RET_IF(dbConnector->DBInitialize(GetSettingDBFilePath(), false) == false);
-    {
-        DBStatement statement(mQueryGenernator.MakeUpdateQuery(SETTING_TABLE, "CurrentCityLocationId = ?"));
-        statement.BindText(1, locationId);
-        statement.Step();
-    }
-    dbConnector->DBFinalize();
+    DBCycleCloser cycle(dbConnector);
+    DBStatement statement(mQueryGenernator.MakeUpdateQuery(SETTING_TABLE, "CurrentCityLocationId = ?"));
+    statement.BindText(1, locationId);
+    statement.Step();
 }
 
 SettingPtr SettingDBController::Select()
 {
     DBConnector* dbConnector = DBConnector::GetInstance();
     COMMON_RETV_IF(dbConnector->DBInitialize(GetSettingDBFilePath(), true) == false, nullptr);
-    SettingPtr settingPtr = SelectRow();
-    dbConnector->DBFinalize();
-    return settingPtr;
+    DBCycleCloser cycle(dbConnector);
+    return SelectRow();
 }
 
 void SettingDBController::UpgradeDB(double /*currentVersion*/) {}

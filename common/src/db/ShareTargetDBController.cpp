@@ -2,6 +2,7 @@
 
 #include "CommonLog.h"
 #include "DBConnector.h"
+#include "DBCycleCloser.h"
 #include "DBStatement.h"
 #include "FileUtil.h"
 #include "TableQuery.h"
@@ -34,9 +35,9 @@ int ShareTargetDBController::Initialize()
 {
     DBConnector* dbConnector = DBConnector::GetInstance();
     COMMON_RETV_IF(dbConnector->DBInitialize(GetShareTargetDataDBFilePath(), false) == false, ERR_FAIL);
+    DBCycleCloser cycle(dbConnector);
     if (IsShareTargetTableExist() == false)
         CreateTable();
-    dbConnector->DBFinalize();
     return ERR_OK;
 }
 
@@ -55,6 +56,7 @@ void ShareTargetDBController::Insert(const ShareTargetPtr& shareTargetPtr)
     COMMON_RET_IF(!shareTargetPtr);
     DBConnector* dbConnector = DBConnector::GetInstance();
     COMMON_RET_IF(dbConnector->DBInitialize(GetShareTargetDataDBFilePath(), false) == false);
+    DBCycleCloser cycle(dbConnector);
     // A scan that could not finish (busy, broken file) must not let a
     // second row with the same id in.
     int scanResult = SQLITE_DONE;
@@ -64,27 +66,20 @@ void ShareTargetDBController::Insert(const ShareTargetPtr& shareTargetPtr)
     else if (scanResult != SQLITE_DONE)
         COMMON_LOG("Fail to read SHARE_TARGET_TABLE : %d", scanResult);
     if (isStored || scanResult != SQLITE_DONE)
-    {
-        dbConnector->DBFinalize();
         return;
-    }
-    {
-        DBStatement statement(mQueryGenernator.MakeInsertQuery(
-            SHARE_TARGET_TABLE, SHARE_TARGET_INSERT_COLUMNS, SHARE_TARGET_PLACEHOLDERS));
-        statement.BindText(1, shareTargetPtr->GetAppID());
-        statement.BindText(2, shareTargetPtr->GetPortID());
-        statement.Step();
-    }
-    dbConnector->DBFinalize();
+    DBStatement statement(mQueryGenernator.MakeInsertQuery(SHARE_TARGET_TABLE, SHARE_TARGET_INSERT_COLUMNS,
+                                                           SHARE_TARGET_PLACEHOLDERS));
+    statement.BindText(1, shareTargetPtr->GetAppID());
+    statement.BindText(2, shareTargetPtr->GetPortID());
+    statement.Step();
 }
 
 ShareTargetPtrVectorPtr ShareTargetDBController::Select()
 {
     DBConnector* dbConnector = DBConnector::GetInstance();
     COMMON_RETV_IF(dbConnector->DBInitialize(GetShareTargetDataDBFilePath(), true) == false, nullptr);
-    ShareTargetPtrVectorPtr shareTargetPtrVector = SelectRows();
-    dbConnector->DBFinalize();
-    return shareTargetPtrVector;
+    DBCycleCloser cycle(dbConnector);
+    return SelectRows();
 }
 
 void ShareTargetDBController::UpgradeDB(double /*currentVersion*/) {}

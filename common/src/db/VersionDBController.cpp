@@ -2,6 +2,7 @@
 
 #include "CommonLog.h"
 #include "DBConnector.h"
+#include "DBCycleCloser.h"
 #include "DBStatement.h"
 #include "FileUtil.h"
 #include "TableQuery.h"
@@ -31,10 +32,10 @@ int VersionDBController::Initialize()
 {
     DBConnector* dbConnector = DBConnector::GetInstance();
     COMMON_RETV_IF(dbConnector->DBInitialize(GetVersionDBFilePath(), false) == false, ERR_FAIL);
+    DBCycleCloser cycle(dbConnector);
     CreateTable();
     if (GetCurrentVersion() < 0)
         Insert(0.0);
-    dbConnector->DBFinalize();
     return ERR_OK;
 }
 
@@ -42,9 +43,8 @@ double VersionDBController::GetCurrentDBVersion()
 {
     DBConnector* dbConnector = DBConnector::GetInstance();
     COMMON_RETV_IF(dbConnector->DBInitialize(GetVersionDBFilePath(), true) == false, 0.0);
-    double version = GetCurrentVersion();
-    dbConnector->DBFinalize();
-    return version;
+    DBCycleCloser cycle(dbConnector);
+    return GetCurrentVersion();
 }
 
 double VersionDBController::GetCurrentVersion()
@@ -82,8 +82,8 @@ bool VersionDBController::UpgradeDB(double version)
 {
     DBConnector* dbConnector = DBConnector::GetInstance();
     COMMON_RETV_IF(dbConnector->DBInitialize(GetVersionDBFilePath(), false) == false, false);
+    DBCycleCloser cycle(dbConnector);
     Update(version);
-    dbConnector->DBFinalize();
     return true;
 }
 
