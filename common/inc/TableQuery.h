@@ -78,8 +78,7 @@ public:
     {
         std::map<int, std::shared_ptr<Record>> records;
         DBStatement stmt(query);
-        while (stmt.Step() == SQLITE_ROW)
-            records.emplace(stmt.ColumnInt(keyColumn), read(stmt));
+        while (stmt.Step() == SQLITE_ROW) records.emplace(stmt.ColumnInt(keyColumn), read(stmt));
         return records;
     }
 
@@ -88,11 +87,13 @@ public:
     static void InsertList(const std::string& query, int foreignKey,
                            const std::vector<std::shared_ptr<Record>>& list, Binder<Record> bind)
     {
-        StepEachEntry(query, list, [&](DBStatement& stmt, int index, const std::shared_ptr<Record>& entry) {
-            stmt.BindInt(1, foreignKey);
-            stmt.BindInt(2, index);
-            bind(stmt, 3, entry);
-        });
+        StepEachEntry(query, list,
+                      [&](DBStatement& stmt, int index, const std::shared_ptr<Record>& entry)
+                      {
+                          stmt.BindInt(1, foreignKey);
+                          stmt.BindInt(2, index);
+                          bind(stmt, 3, entry);
+                      });
     }
 
     // Update: the values, then FK_ID and the index for the WHERE clause.
@@ -100,11 +101,13 @@ public:
     static void UpdateList(const std::string& query, int foreignKey,
                            const std::vector<std::shared_ptr<Record>>& list, Binder<Record> bind)
     {
-        StepEachEntry(query, list, [&](DBStatement& stmt, int index, const std::shared_ptr<Record>& entry) {
-            int next = bind(stmt, 1, entry);
-            stmt.BindInt(next, foreignKey);
-            stmt.BindInt(next + 1, index);
-        });
+        StepEachEntry(query, list,
+                      [&](DBStatement& stmt, int index, const std::shared_ptr<Record>& entry)
+                      {
+                          int next = bind(stmt, 1, entry);
+                          stmt.BindInt(next, foreignKey);
+                          stmt.BindInt(next + 1, index);
+                      });
     }
 
     // Never null; empty when the city has no rows.
@@ -114,8 +117,7 @@ public:
         ListPtr<Record> list = std::make_shared<std::vector<std::shared_ptr<Record>>>();
         DBStatement stmt(query);
         stmt.BindInt(1, foreignKey);
-        while (stmt.Step() == SQLITE_ROW)
-            list->push_back(read(stmt));
+        while (stmt.Step() == SQLITE_ROW) list->push_back(read(stmt));
         return list;
     }
 

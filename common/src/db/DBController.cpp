@@ -37,7 +37,8 @@ T FindOr(const std::map<int, T>& values, int key, T fallback)
 }  // namespace
 
 // Opens the weather database for the rest of the calling operation (see
-// DBCycleCloser). A failed open is logged as that operation's guard and returns failValue.
+// DBCycleCloser). A failed open is logged as that operation's own guard
+// line and returns failValue.
 #define WEATHER_DB_CYCLE_OR_RETURN(isReadOnly, failValue)                                             \
     DBConnector* dbConnector = DBConnector::GetInstance();                                            \
     COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), isReadOnly) == false, failValue); \

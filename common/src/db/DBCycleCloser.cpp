@@ -5,9 +5,7 @@
 namespace NSWeather
 {
 
-DBCycleCloser::DBCycleCloser(DBConnector* dbConnector) : mDBConnector(dbConnector)
-{
-}
+DBCycleCloser::DBCycleCloser(DBConnector* dbConnector) : mDBConnector(dbConnector) {}
 
 DBCycleCloser::~DBCycleCloser()
 {

@@ -18,7 +18,8 @@ using EntryPtr = std::shared_ptr<Entry>;
 using EntryList = std::vector<EntryPtr>;
 
 const char* const kTable = "ENTRY_TABLE";
-const char* const kCreate = "CREATE TABLE IF NOT EXISTS %s (FK_ID INTEGER, entryIndex INTEGER, value INTEGER);";
+const char* const kCreate =
+    "CREATE TABLE IF NOT EXISTS %s (FK_ID INTEGER, entryIndex INTEGER, value INTEGER);";
 
 int BindEntry(DBStatement& stmt, int i, const EntryPtr& entry)
 {
@@ -43,8 +44,7 @@ EntryPtr MakeEntry(int value)
 std::vector<int> Values(const EntryList& list)
 {
     std::vector<int> values;
-    for (const EntryPtr& entry : list)
-        values.push_back(entry->value);
+    for (const EntryPtr& entry : list) values.push_back(entry->value);
     return values;
 }
 
@@ -70,8 +70,8 @@ protected:
     }
     void InsertList(int foreignKey, const EntryList& list)
     {
-        TableQuery::InsertList("INSERT INTO ENTRY_TABLE (FK_ID,entryIndex,value) VALUES (?, ?, ?)", foreignKey, list,
-                               BindEntry);
+        TableQuery::InsertList("INSERT INTO ENTRY_TABLE (FK_ID,entryIndex,value) VALUES (?, ?, ?)",
+                               foreignKey, list, BindEntry);
     }
 
     std::string mPath;
