@@ -14,17 +14,6 @@
 #include "app_common.h"
 #include "app_manager.h"
 
-// The guard macros would print NULL expanded; these guards keep the source text.
-#define FILE_UTIL_RETV_IF_NULL(text, value)                                                    \
-    do                                                                                         \
-    {                                                                                          \
-        if (text == nullptr)                                                                   \
-        {                                                                                      \
-            COMMON_LOG("[%s(): %d] (%s) [return]", __func__, __LINE__, #text " == NULL");      \
-            return value;                                                                      \
-        }                                                                                      \
-    } while (0)
-
 namespace NSWeather
 {
 
@@ -61,7 +50,7 @@ std::string FileUtil::GetSharedDataDirectoryPath()
     int ret = app_manager_get_shared_data_path(WEATHER_APP_ID, &sharedDataDirPath);
     PlatformText owner(sharedDataDirPath);
     COMMON_RETV_IF(ret != ERR_OK, std::string());
-    FILE_UTIL_RETV_IF_NULL(sharedDataDirPath, std::string());
+    COMMON_RETV_IF(sharedDataDirPath == NULL, std::string());
     if (sharedDataDirPath[0] == '\0')
     {
         COMMON_LOG("sharedDataDirPath < 1");
@@ -80,7 +69,7 @@ std::string FileUtil::GetSharedResourceDirectoryPath()
     int ret = app_manager_get_shared_resource_path(WEATHER_APP_ID, &sharedResDirPath);
     PlatformText owner(sharedResDirPath);
     COMMON_RETV_IF(ret != ERR_OK, std::string());
-    FILE_UTIL_RETV_IF_NULL(sharedResDirPath, std::string());
+    COMMON_RETV_IF(sharedResDirPath == NULL, std::string());
     if (sharedResDirPath[0] == '\0')
         return std::string();
     gSharedResDirPath = AsDirectory(sharedResDirPath);
@@ -95,7 +84,7 @@ std::string FileUtil::GetResourceDirectoryPath()
     char* resourceDirPath = app_get_resource_path();
     PlatformText owner(resourceDirPath);
     COMMON_LOG("app_get_resource_path : %s", resourceDirPath ? resourceDirPath : "NULL");
-    FILE_UTIL_RETV_IF_NULL(resourceDirPath, std::string());
+    COMMON_RETV_IF(resourceDirPath == NULL, std::string());
     if (resourceDirPath[0] == '\0')
     {
         COMMON_LOG("resourceDirPath < 1");
