@@ -4,10 +4,10 @@
 #include <gtest/gtest.h>
 
 #include <climits>
-#include <fstream>
 #include <string>
 #include <vector>
 
+#include "TestFiles.h"
 #include "TestPlatform.h"
 
 using NSWeather::QuorvexLogManager;
@@ -53,10 +53,9 @@ protected:
 
     std::vector<Record> Records() const
     {
-        std::ifstream file(mRoot.Path("log/usage.log"));
         std::vector<Record> records;
-        std::string line;
-        while (std::getline(file, line)) records.push_back(Parse(line));
+        for (const std::string& line : WeatherTest::ReadLines(mRoot.Path("log/usage.log")))
+            records.push_back(Parse(line));
         return records;
     }
 
