@@ -6,11 +6,18 @@
 
 #include <sys/stat.h>
 
+#include "CityDBController.h"
+#include "CurrentWeatherDBController.h"
+#include "ExtraWeatherDBController.h"
+#include "HourlyWeatherDBController.h"
+#include "MoonPhaseDBController.h"
 #include "SettingDBController.h"
+#include "WeeklyWeatherDBController.h"
 #include "WeatherDefine.h"
 
 namespace SettingsTest
 {
+using namespace NSWeather;
 
 RawDB::RawDB(const std::string& path, bool isReadOnly)
 {
@@ -86,47 +93,13 @@ std::vector<std::string> RawDB::ColumnNames(const std::string& table)
     return QueryTexts("SELECT name FROM pragma_table_info('" + table + "')");
 }
 
-// The creation statements of the weather tables, as the writers of the
-// suite create them.
 const std::pair<const char*, const char*> WEATHER_TABLE_FORMATS[6] = {
-    {"CITY_TABLE",
-     "CREATE TABLE IF NOT EXISTS %s (PK_ID\t\t\t\tINTEGER NOT NULL PRIMARY KEY "
-     "AUTOINCREMENT,pageIndex\t\t\tINTEGER,locationId\t\t\tTEXT,cityName\t\t\tTEXT,cityNameEng\t\tTEXT,"
-     "countryName\t\tTEXT,countryNameEng\t\tTEXT,isCurrentLocation\tINTEGER,isSummerTime\t\tINTEGER,"
-     "isDayTime\t\t\tINTEGER,gmtOffset\t\t\tDOUBLE,refreshedTime\t\tINT64,localTime\t\t\tINT64,"
-     "widgetReferenceCount\t\tINTEGER,needToUpdate\t\tINTEGER,websiteUrl \t\tTEXT);"},
-    {"CURRENT_WEATHER_TABLE",
-     "CREATE TABLE IF NOT EXISTS %s "
-     "(FK_ID\t\t\t\tINTEGER,weatherIcon\t\tINTEGER,weatherStatus\t\tTEXT,curTemperature\t\tDOUBLE,"
-     "lowTemperature\t\tDOUBLE,highTemperature\tDOUBLE,date\t\t\t\tINT64,websiteUrl \t\tTEXT,FOREIGN "
-     "KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);"},
-    {"HOURLY_WEATHER_TABLE",
-     "CREATE TABLE IF NOT EXISTS %s "
-     "(FK_ID\t\t\t\tINTEGER,hourlyIndex\t\tINTEGER,hour\t\t\t\tINT64,weatherIcon\t\tINTEGER,"
-     "weatherStatus\t\tTEXT,curTemperature\t\tDOUBLE,lowTemperature\t\tDOUBLE,highTemperature\tDOUBLE,"
-     "websiteUrl\t\t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE "
-     "CASCADE);"},
-    {"WEEKLY_WEATHER_TABLE",
-     "CREATE TABLE IF NOT EXISTS %s "
-     "(FK_ID\t\t\t\tINTEGER,weeklyIndex\t\tINTEGER,weatherIcon\t\tINTEGER,weatherStatus\t\tTEXT,"
-     "curTemperature\t\tDOUBLE,lowTemperature\t\tDOUBLE,highTemperature\tDOUBLE,date\t\t\t\tINT64,websiteUrl "
-     "\t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);"},
-    {"EXTRA_WEATHER_TABLE",
-     "CREATE TABLE IF NOT EXISTS %s "
-     "(FK_ID\t\t\t\tINTEGER,humidity\t\t\tINTEGER,sunsetTime\t\t\tINT64,sunriseTime\t\tINT64,"
-     "pm25\t\t\t\tINTEGER,pm10\t\t\t\tINTEGER,aqi\t\t\t\tINTEGER,uvIndex\t\t\tINTEGER,"
-     "outdoorExcercise\tINTEGER,comfort\t\t\tINTEGER,clothing\t\t\tINTEGER,skincare\t\t\tINTEGER,"
-     "carwash\t\t\tINTEGER,foodPoison\t\t\tINTEGER,heat\t\t\t\tINTEGER,spoiledFood\t\tINTEGER,"
-     "discomfort\t\t\tINTEGER,frozenPipes\t\tINTEGER,frostbite\t\t\tINTEGER,cold\t\t\t\tINTEGER,"
-     "pollen\t\t\t\tINTEGER,airDust\t\t\tINTEGER,drySkin\t\t\tINTEGER,realfeel\t\t\tDOUBLE,"
-     "precType\t\t\tINTEGER,precProbability\tDOUBLE,precAmount\t\t\tDOUBLE,precProbabilityNight\tDOUBLE,"
-     "precAmountNight\t\t\tDOUBLE,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON "
-     "UPDATE CASCADE);"},
-    {"MOON_PHASE_TABLE",
-     "CREATE TABLE IF NOT EXISTS %s "
-     "(FK_ID\t\t\t\tINTEGER,moonPhaseIndex\t\tINTEGER,locationID\t\t\tTEXT,date\t\t\t\tINT64,"
-     "moonRiseTime\t\tINT64,moonSetTime\t\tINT64,phaseText\t\t\tTEXT,age\t\t\t\tINTEGER,FOREIGN KEY(FK_ID) "
-     "REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);"},
+    {CityDBController::TABLE_NAME, CityDBController::CREATE_TABLE_FORMAT},
+    {CurrentWeatherDBController::TABLE_NAME, CurrentWeatherDBController::CREATE_TABLE_FORMAT},
+    {HourlyWeatherDBController::TABLE_NAME, HourlyWeatherDBController::CREATE_TABLE_FORMAT},
+    {WeeklyWeatherDBController::TABLE_NAME, WeeklyWeatherDBController::CREATE_TABLE_FORMAT},
+    {ExtraWeatherDBController::TABLE_NAME, ExtraWeatherDBController::CREATE_TABLE_FORMAT},
+    {MoonPhaseDBController::TABLE_NAME, MoonPhaseDBController::CREATE_TABLE_FORMAT},
 };
 
 namespace

@@ -45,6 +45,7 @@ std::string StoredCreateSql(const std::string& format, const std::string& table)
 // The weather tables as a database of the given schema version has them:
 // the columns that later versions added are left out.
 std::string OldWeatherTableSql(const std::string& table, double version);
+// Name and creation format of each weather table, as the store defines them.
 extern const std::pair<const char*, const char*> WEATHER_TABLE_FORMATS[6];
 
 bool FileExists(const std::string& path);

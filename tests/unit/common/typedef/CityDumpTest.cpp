@@ -105,24 +105,6 @@ TEST(CityDumpTest, EmptyCityDumpsOnlyHeaderLinesOfLists)
     EXPECT_EQ(Texts(log).size(), 2u) << log.Dump();
 }
 
-TEST(CityDumpTest, DumpsLeaveTheRecordAlone)
-{
-    CityPtr city = MakeCity();
-    CurrentPtr current = city->GetCurrentPtr();
-    WeeklyPtrVectorPtr weekly = city->GetWeeklyPtrVector();
-    WeatherTest::LogCapture log;
-    DumpAll(*city);
-
-    EXPECT_EQ(city->GetCityName(), "Lyon");
-    EXPECT_EQ(city->GetPageIndex(), 1);
-    EXPECT_EQ(city->GetCurrentPtr(), current);
-    EXPECT_EQ(city->GetWeeklyPtrVector(), weekly);
-    EXPECT_EQ(weekly->size(), 2u);
-    EXPECT_EQ(city->GetHourlyPtrVector()->size(), 1u);
-    EXPECT_DOUBLE_EQ(current->GetCurTemperature()->GetCelsius(), 21.0);
-    EXPECT_DOUBLE_EQ(current->GetCurTemperature()->GetFahrenheit(), 69.9);
-}
-
 // The stores may leave parts absent; a dump must say so, not crash.
 TEST(CityDumpTest, AbsentPartsAreNamed)
 {
