@@ -45,7 +45,7 @@ TEST_F(DBConnectorTest, SecondInitializeKeepsTheFirstFile)
     mConnector->DBFinalize();
     EXPECT_FALSE(mConnector->GetIsOpened());
     EXPECT_FALSE(FileExists(second));
-    EXPECT_EQ(RawDB(first).Int("SELECT COUNT(*) FROM sqlite_master WHERE name = 'T';"), 1);
+    EXPECT_EQ(RawDB(first).QueryInt("SELECT COUNT(*) FROM sqlite_master WHERE name = 'T';"), 1);
 }
 
 TEST_F(DBConnectorTest, EmptyAndMissingPaths)
@@ -73,10 +73,10 @@ TEST_F(DBConnectorTest, CycleCommitsEverythingAtTheEnd)
     {
         RawDB other(WeatherDBPath());
         // Another connection does not see the uncommitted row yet.
-        EXPECT_EQ(other.Int("SELECT COUNT(*) FROM CITY_TABLE;"), 0);
+        EXPECT_EQ(other.QueryInt("SELECT COUNT(*) FROM CITY_TABLE;"), 0);
     }
     mConnector->DBFinalize();
-    EXPECT_EQ(RawDB(WeatherDBPath()).Int("SELECT COUNT(*) FROM CITY_TABLE;"), 1);
+    EXPECT_EQ(RawDB(WeatherDBPath()).QueryInt("SELECT COUNT(*) FROM CITY_TABLE;"), 1);
 }
 
 TEST_F(DBConnectorTest, FailedStatementsAreLoggedAndHarmless)

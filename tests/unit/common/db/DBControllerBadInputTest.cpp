@@ -164,8 +164,8 @@ TEST_F(DBControllerBadInputTest, ForeignSchemaGivesEmptyResults)
     EXPECT_TRUE(mLog.Contains("Fail: sqlite3_prepare_v2 Failed"));
     EXPECT_FALSE(DBConnector::GetInstance()->GetIsOpened());
     RawDB raw(WeatherDBPath());
-    EXPECT_EQ(raw.Column("SELECT name FROM CITY_TABLE;"), (std::vector<std::string>{"theirs", "also theirs"}));
-    EXPECT_EQ(raw.Column("SELECT body FROM notes;"), (std::vector<std::string>{"keep"}));
+    EXPECT_EQ(raw.QueryTexts("SELECT name FROM CITY_TABLE;"), (std::vector<std::string>{"theirs", "also theirs"}));
+    EXPECT_EQ(raw.QueryTexts("SELECT body FROM notes;"), (std::vector<std::string>{"keep"}));
 }
 
 TEST_F(DBControllerBadInputTest, UnreadableCitiesAreNotExpired)

@@ -141,17 +141,17 @@ TEST_F(DBControllerTest, ChildRowsCarryTheCityKeyAndTheirIndex)
 {
     InsertCities({"A", "B"});
     RawDB raw(WeatherDBPath());
-    int64_t keyB = raw.Int("SELECT PK_ID FROM CITY_TABLE WHERE locationId = 'B';");
-    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) + ";"), 24);
+    int64_t keyB = raw.QueryInt("SELECT PK_ID FROM CITY_TABLE WHERE locationId = 'B';");
+    EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) + ";"), 24);
     std::vector<std::string> indexes =
-        raw.Column("SELECT hourlyIndex FROM HOURLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) +
+        raw.QueryTexts("SELECT hourlyIndex FROM HOURLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) +
                    " ORDER BY hourlyIndex;");
     ASSERT_EQ(indexes.size(), 24u);
     EXPECT_EQ(indexes.front(), "0");
     EXPECT_EQ(indexes.back(), "23");
-    EXPECT_EQ(raw.Column("SELECT curTemperature FROM CURRENT_WEATHER_TABLE;"),
+    EXPECT_EQ(raw.QueryTexts("SELECT curTemperature FROM CURRENT_WEATHER_TABLE;"),
               (std::vector<std::string>{"21.5", "21.5"}));
-    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM WEEKLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) + ";"), 10);
+    EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM WEEKLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) + ";"), 10);
 }
 
 TEST_F(DBControllerTest, EmptyTableGivesAnEmptyList)
@@ -211,7 +211,7 @@ TEST_F(DBControllerTest, CityThatIsNotStoredLeavesNoOrphanRows)
     RawDB raw(WeatherDBPath());
     for (const char* table : {"CURRENT_WEATHER_TABLE", "WEEKLY_WEATHER_TABLE", "HOURLY_WEATHER_TABLE",
                               "EXTRA_WEATHER_TABLE", "MOON_PHASE_TABLE"})
-        EXPECT_EQ(raw.Int(std::string("SELECT COUNT(*) FROM ") + table + " WHERE FK_ID < 1;"), 0) << table;
+        EXPECT_EQ(raw.QueryInt(std::string("SELECT COUNT(*) FROM ") + table + " WHERE FK_ID < 1;"), 0) << table;
     EXPECT_EQ(mDB.SelectCityData(0)->GetCityName(), "city A-0");
 }
 
@@ -239,9 +239,9 @@ TEST_F(DBControllerTest, DeleteRenumbersInInsertionOrder)
     ASSERT_EQ(mDB.DeleteCityData(std::string("A")), ERR_OK);
     EXPECT_EQ(PageOrder(), (std::vector<std::string>{"B@0", "C@1"}));
     RawDB raw(WeatherDBPath());
-    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE;"), 48);
-    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM CURRENT_WEATHER_TABLE;"), 2);
-    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM EXTRA_WEATHER_TABLE;"), 2);
+    EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE;"), 48);
+    EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM CURRENT_WEATHER_TABLE;"), 2);
+    EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM EXTRA_WEATHER_TABLE;"), 2);
 
     ASSERT_EQ(mDB.DeleteCityData(1), ERR_OK);
     EXPECT_EQ(PageOrder(), (std::vector<std::string>{"B@0"}));
@@ -331,14 +331,14 @@ TEST_F(DBControllerTest, DeleteAllAndReplace)
     ASSERT_EQ(mDB.DeleteAllCityDataAndInsertCityPtrVector(next), ERR_OK);
     EXPECT_EQ(PageOrder(), (std::vector<std::string>{"X@0", "Y@1"}));
     EXPECT_TRUE(mLog.Contains("There is a same city in DB"));
-    EXPECT_EQ(RawDB(WeatherDBPath()).Int("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE;"), 48);
+    EXPECT_EQ(RawDB(WeatherDBPath()).QueryInt("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE;"), 48);
 
     ASSERT_EQ(mDB.DeleteAllCityData(), ERR_OK);
     EXPECT_TRUE(mLog.Contains("DeleteAllCityData"));
     RawDB raw(WeatherDBPath());
     for (const char* table : {"CITY_TABLE", "CURRENT_WEATHER_TABLE", "WEEKLY_WEATHER_TABLE", "HOURLY_WEATHER_TABLE",
                               "EXTRA_WEATHER_TABLE"})
-        EXPECT_EQ(raw.Int(std::string("SELECT COUNT(*) FROM ") + table + ";"), 0) << table;
+        EXPECT_EQ(raw.QueryInt(std::string("SELECT COUNT(*) FROM ") + table + ";"), 0) << table;
 }
 
 TEST_F(DBControllerTest, UselessMoonPhasesAreRemoved)
@@ -353,13 +353,13 @@ TEST_F(DBControllerTest, UselessMoonPhasesAreRemoved)
     mDB.UpdateOnlyMoonPhaseData(b);
     mDB.UpdateOnlyMoonPhaseData(b);  // replaces, does not add
     RawDB raw(WeatherDBPath());
-    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM MOON_PHASE_TABLE;"), 6);
+    EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM MOON_PHASE_TABLE;"), 6);
 
     mDB.DeleteCityData(std::string("A"));
-    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM MOON_PHASE_TABLE;"), 6);
+    EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM MOON_PHASE_TABLE;"), 6);
     ASSERT_EQ(mDB.DeleteUselessMoonPhaseData(), ERR_OK);
-    EXPECT_EQ(raw.Column("SELECT DISTINCT locationID FROM MOON_PHASE_TABLE;"), (std::vector<std::string>{"B"}));
-    EXPECT_EQ(raw.Int("SELECT COUNT(*) FROM MOON_PHASE_TABLE;"), 3);
+    EXPECT_EQ(raw.QueryTexts("SELECT DISTINCT locationID FROM MOON_PHASE_TABLE;"), (std::vector<std::string>{"B"}));
+    EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM MOON_PHASE_TABLE;"), 3);
 }
 
 TEST_F(DBControllerTest, ExpiryFollowsTheOldestRefreshAndTheInterval)

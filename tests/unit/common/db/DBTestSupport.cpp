@@ -131,49 +131,4 @@ CityPtr MakeCity(const std::string& locationId, int seed, bool isCurrentLocation
     return city;
 }
 
-RawDB::RawDB(const std::string& path)
-{
-    if (sqlite3_open_v2(path.c_str(), &mDB, SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE, nullptr) != SQLITE_OK)
-        ADD_FAILURE() << "cannot open " << path;
-}
-
-RawDB::~RawDB()
-{
-    sqlite3_close(mDB);
-}
-
-bool RawDB::Exec(const std::string& sql)
-{
-    char* error = nullptr;
-    int rc = sqlite3_exec(mDB, sql.c_str(), nullptr, nullptr, &error);
-    if (rc != SQLITE_OK)
-        ADD_FAILURE() << sql << ": " << (error ? error : "");
-    sqlite3_free(error);
-    return rc == SQLITE_OK;
-}
-
-std::vector<std::string> RawDB::Column(const std::string& sql)
-{
-    std::vector<std::string> values;
-    sqlite3_stmt* stmt = nullptr;
-    if (sqlite3_prepare_v2(mDB, sql.c_str(), -1, &stmt, nullptr) != SQLITE_OK)
-    {
-        ADD_FAILURE() << sql << ": " << sqlite3_errmsg(mDB);
-        return values;
-    }
-    while (sqlite3_step(stmt) == SQLITE_ROW)
-    {
-        const unsigned char* text = sqlite3_column_text(stmt, 0);
-        values.push_back(text ? reinterpret_cast<const char*>(text) : "");
-    }
-    sqlite3_finalize(stmt);
-    return values;
-}
-
-int64_t RawDB::Int(const std::string& sql)
-{
-    std::vector<std::string> values = Column(sql);
-    return values.empty() ? -999999 : std::stoll(values[0]);
-}
-
 }  // namespace WeatherTest

@@ -1,9 +1,10 @@
 #include "QueryGenernator.h"
 
 #include <gtest/gtest.h>
-#include <sqlite3.h>
 
 #include <string>
+
+#include "TestDB.h"
 
 using NSWeather::QueryGenernator;
 
@@ -67,23 +68,14 @@ TEST(QueryGenernator, TypedConditionEscapesQuotes)
     EXPECT_EQ(gen.AddCondition("name = ", std::string("O'Brien")), "name = 'O''Brien'");
     EXPECT_EQ(QueryGenernator::EscapeQuotes("''"), "''''");
 
-    sqlite3* db = nullptr;
-    ASSERT_EQ(sqlite3_open(":memory:", &db), SQLITE_OK);
-    ASSERT_EQ(sqlite3_exec(db, "CREATE TABLE T (name TEXT); INSERT INTO T VALUES ('O''Brien'), ('other');", nullptr,
-                           nullptr, nullptr),
-              SQLITE_OK);
+    WeatherTest::RawDB db(":memory:");
+    db.Exec("CREATE TABLE T (name TEXT); INSERT INTO T VALUES ('O''Brien'), ('other');");
     auto count = [&](const std::string& value) {
         QueryGenernator where;
         where.ResetCondition(1);
         where.AddCondition("name = ", value);
-        std::string sql = where.MakeSelectQuery("T", "COUNT(*)", where.MakeWhereClause(where.GetCondition()));
-        sqlite3_stmt* stmt = nullptr;
-        EXPECT_EQ(sqlite3_prepare_v2(db, sql.c_str(), -1, &stmt, nullptr), SQLITE_OK) << sql;
-        int rows = sqlite3_step(stmt) == SQLITE_ROW ? sqlite3_column_int(stmt, 0) : -1;
-        sqlite3_finalize(stmt);
-        return rows;
+        return db.QueryInt(where.MakeSelectQuery("T", "COUNT(*)", where.MakeWhereClause(where.GetCondition())));
     };
     EXPECT_EQ(count("O'Brien"), 1);
     EXPECT_EQ(count("x' OR '1'='1"), 0);
-    sqlite3_close(db);
 }

@@ -63,7 +63,7 @@ protected:
     {
         // Committed first so that a second connection sees the rows.
         DBConnector::GetInstance()->DBFinalize();
-        std::vector<std::string> rows = RawDB(mPath).Column(
+        std::vector<std::string> rows = RawDB(mPath).QueryTexts(
             "SELECT FK_ID || ':' || entryIndex || '=' || value FROM ENTRY_TABLE ORDER BY FK_ID, entryIndex;");
         DBConnector::GetInstance()->DBInitialize(mPath, false);
         return rows;

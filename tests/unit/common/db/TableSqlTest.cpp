@@ -41,11 +41,7 @@ protected:
 TEST_F(TableSqlTest, CreateStatementsAreExact)
 {
     RawDB raw(WeatherDBPath());
-    auto sql = [&](const char* table) {
-        std::vector<std::string> rows =
-            raw.Column(std::string("SELECT sql FROM sqlite_master WHERE name = '") + table + "';");
-        return rows.empty() ? std::string() : rows[0];
-    };
+    auto sql = [&](const char* table) { return raw.TableSql(table); };
     EXPECT_EQ(sql("CITY_TABLE"),
               "CREATE TABLE CITY_TABLE (PK_ID\t\t\t\tINTEGER NOT NULL PRIMARY KEY AUTOINCREMENT,pageIndex\t\t\tINTEGER,"
               "locationId\t\t\tTEXT,cityName\t\t\tTEXT,cityNameEng\t\tTEXT,countryName\t\tTEXT,countryNameEng\t\tTEXT,"

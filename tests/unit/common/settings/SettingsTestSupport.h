@@ -5,39 +5,14 @@
 #include <utility>
 #include <vector>
 
-#include <sqlite3.h>
-
 #include "FileUtil.h"
+#include "TestDB.h"
 #include "TestPlatform.h"
 
 namespace SettingsTest
 {
 
-// Direct access to a database file, beside the code under test.
-class RawDB
-{
-public:
-    explicit RawDB(const std::string& path, bool isReadOnly = false);
-    ~RawDB();
-    RawDB(const RawDB&) = delete;
-    RawDB& operator=(const RawDB&) = delete;
-
-    bool GetIsOpen() const { return mHandle != nullptr; }
-    // Fails the running test when the statement fails.
-    void Exec(const std::string& sql);
-    bool TryExec(const std::string& sql);
-    // First column of the first row; empty text / 0 when there is none.
-    std::string QueryText(const std::string& sql);
-    double QueryDouble(const std::string& sql);
-    long long QueryInt(const std::string& sql);
-    std::vector<std::string> QueryTexts(const std::string& sql);
-    // The CREATE statement SQLite keeps for a table, empty when absent.
-    std::string TableSql(const std::string& table);
-    std::vector<std::string> ColumnNames(const std::string& table);
-
-private:
-    sqlite3* mHandle = nullptr;
-};
+using RawDB = WeatherTest::RawDB;
 
 // "CREATE TABLE IF NOT EXISTS %s (...);" as SQLite keeps it once run.
 std::string StoredCreateSql(const std::string& format, const std::string& table);
