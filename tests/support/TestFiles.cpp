@@ -18,6 +18,11 @@ std::string ReadText(const std::string& path)
     return content.str();
 }
 
+void WriteText(const std::string& path, const std::string& text)
+{
+    std::ofstream(path, std::ios::binary | std::ios::trunc) << text;
+}
+
 std::vector<std::string> ReadLines(const std::string& path)
 {
     std::ifstream file(path);

@@ -10,6 +10,9 @@ namespace WeatherTest
 // The whole file; empty when it cannot be read.
 std::string ReadText(const std::string& path);
 
+// Replaces the file's content with `text`.
+void WriteText(const std::string& path, const std::string& text);
+
 // The file's lines without their line ends; none when it cannot be read.
 std::vector<std::string> ReadLines(const std::string& path);
 

@@ -12,6 +12,7 @@
 #include "DBTestSupport.h"
 #include "FileUtil.h"
 #include "SettingDBController.h"
+#include "TestFiles.h"
 #include "WeatherDefine.h"
 
 using namespace NSWeather;
@@ -90,12 +91,7 @@ protected:
     void ReplaceWeatherDB(const std::string& content)
     {
         unlink(WeatherDBPath().c_str());
-        std::ofstream(WeatherDBPath(), std::ios::binary) << content;
-    }
-    std::string ReadWeatherDB()
-    {
-        std::ifstream in(WeatherDBPath(), std::ios::binary);
-        return std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
+        WeatherTest::WriteText(WeatherDBPath(), content);
     }
 };
 }  // namespace
@@ -108,7 +104,7 @@ TEST_F(DBControllerBadInputTest, RandomBytesAreNeitherReadNorOverwritten)
         c = static_cast<char>(random());
     ReplaceWeatherDB(bytes);
     ExpectEveryOperationFails();
-    EXPECT_EQ(ReadWeatherDB(), bytes);
+    EXPECT_EQ(WeatherTest::ReadText(WeatherDBPath()), bytes);
 }
 
 TEST_F(DBControllerBadInputTest, UnregisteredWeatherAppGivesAnEmptyPath)

@@ -43,14 +43,14 @@ TEST_F(BadInputTest, SettingsFileOfRandomBytesIsReadAsAbsentAndKept)
     for (unsigned seed : {1u, 2u, 3u})
     {
         std::string garbage = RandomBytes(4096, seed);
-        SettingsTest::WriteFileBytes(SettingDBPath(), garbage);
+        WeatherTest::WriteText(SettingDBPath(), garbage);
 
         ExpectEmptyReadings();
         EXPECT_EQ(ERR_FAIL, SettingDBController().Initialize());
         SettingDBController().Update(std::make_shared<Setting>());
         SettingDBController().UpdateLocationIdOfDisplayCity("x");
         EXPECT_EQ(ERR_FAIL, DataStoreInitializer::Run());
-        EXPECT_EQ(garbage, SettingsTest::ReadFileBytes(SettingDBPath())) << "seed " << seed;
+        EXPECT_EQ(garbage, WeatherTest::ReadText(SettingDBPath())) << "seed " << seed;
     }
 }
 
@@ -84,12 +84,12 @@ TEST_F(BadInputTest, OtherDatabasesOfRandomBytesDoNotStopTheStart)
 {
     MakeDBDir();
     std::string garbage = RandomBytes(2048, 7);
-    SettingsTest::WriteFileBytes(ShareTargetDBPath(), garbage);
-    SettingsTest::WriteFileBytes(VersionDBPath(), garbage);
+    WeatherTest::WriteText(ShareTargetDBPath(), garbage);
+    WeatherTest::WriteText(VersionDBPath(), garbage);
 
     DataStoreInitializer::Run();
-    EXPECT_EQ(garbage, SettingsTest::ReadFileBytes(ShareTargetDBPath()));
-    EXPECT_EQ(garbage, SettingsTest::ReadFileBytes(VersionDBPath()));
+    EXPECT_EQ(garbage, WeatherTest::ReadText(ShareTargetDBPath()));
+    EXPECT_EQ(garbage, WeatherTest::ReadText(VersionDBPath()));
     EXPECT_FALSE(ShareTargetDBController().Select());
     EXPECT_DOUBLE_EQ(0.0, VersionDBController().GetCurrentDBVersion());
     // The settings are still usable.

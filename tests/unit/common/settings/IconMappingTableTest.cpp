@@ -147,7 +147,7 @@ TEST_F(WeatherNewsIconTest, MissingDatabaseIsReportedAndNotCreated)
 
     // An empty file in its place has no icon table.
     mkdir(mRoot.Path("apps/com.quorvex.weather-m-widget/res/data").c_str(), 0755);
-    SettingsTest::WriteFileBytes(iconDB, "");
+    WeatherTest::WriteText(iconDB, "");
     EXPECT_EQ(0, Map(100, true));
     EXPECT_TRUE(mLog.Contains("Fail: sqlite3_prepare_v2 Failed rc [1][no such table: icon_table]"))
         << mLog.Dump();

@@ -105,9 +105,9 @@ TEST_F(SettingDBControllerTest, NullRecordWritesNothingAndDisplayCityWritesOneCo
 {
     InitializeSettings();
     SetSettingColumn("CpType", "'Kweather'");
-    std::string before = SettingsTest::ReadFileBytes(SettingDBPath());
+    std::string before = WeatherTest::ReadText(SettingDBPath());
     SettingDBController().Update(nullptr);
-    EXPECT_EQ(before, SettingsTest::ReadFileBytes(SettingDBPath()));
+    EXPECT_EQ(before, WeatherTest::ReadText(SettingDBPath()));
     EXPECT_TRUE(mLog.Contains("(!settingPtr) [return]")) << mLog.Dump();
 
     SettingDBController().UpdateLocationIdOfDisplayCity("2-226396_1_AL");

@@ -1,7 +1,5 @@
 #include "SettingsTestSupport.h"
 
-#include <fstream>
-#include <iterator>
 #include <sstream>
 
 #include <sys/stat.h>
@@ -114,18 +112,6 @@ bool FileExists(const std::string& path)
 {
     struct stat st;
     return stat(path.c_str(), &st) == 0;
-}
-
-std::string ReadFileBytes(const std::string& path)
-{
-    std::ifstream in(path, std::ios::binary);
-    return std::string(std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>());
-}
-
-void WriteFileBytes(const std::string& path, const std::string& bytes)
-{
-    std::ofstream out(path, std::ios::binary | std::ios::trunc);
-    out << bytes;
 }
 
 SettingsFixture::SettingsFixture()

@@ -7,6 +7,7 @@
 
 #include "FileUtil.h"
 #include "TestDB.h"
+#include "TestFiles.h"
 #include "TestPlatform.h"
 
 namespace SettingsTest
@@ -24,8 +25,6 @@ std::string OldWeatherTableSql(const std::string& table, double version);
 extern const std::pair<const char*, const char*> WEATHER_TABLE_FORMATS[6];
 
 bool FileExists(const std::string& path);
-std::string ReadFileBytes(const std::string& path);
-void WriteFileBytes(const std::string& path, const std::string& bytes);
 
 // A fresh platform root per test, with FileUtil asked again for it.
 class SettingsFixture : public WeatherTest::PlatformTest

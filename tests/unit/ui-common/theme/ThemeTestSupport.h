@@ -3,14 +3,15 @@
 
 #include <Ecore.h>
 #include <Edje.h>
-#include <unistd.h>
 
 #include <array>
-#include <fstream>
 #include <functional>
 #include <string>
 
 #include <uxt_theme.h>
+
+#include "MainLoop.h"
+#include "TestFiles.h"
 
 namespace ThemeTest
 {
@@ -31,21 +32,12 @@ inline Rgba GetClassColor(const std::string& name)
     return c;
 }
 
-inline void WriteText(const std::string& path, const std::string& text)
-{
-    std::ofstream(path, std::ios::binary) << text;
-}
+using WeatherTest::WriteText;
 
 // Runs the main loop until `done` holds or three seconds pass.
 inline bool RunLoopUntil(const std::function<bool()>& done)
 {
-    for (double end = ecore_time_get() + 3.0; !done(); usleep(2000))
-    {
-        if (ecore_time_get() > end)
-            return false;
-        ecore_main_loop_iterate();
-    }
-    return true;
+    return WeatherTest::RunLoopUntil(done, 3.0);
 }
 
 inline std::string TwoThemeColorTable()
