@@ -16,22 +16,18 @@ class LocationTest : public WeatherTest::PlatformTest
 {
 };
 
+// The combined method is what is asked: the GPS key alone does not count.
 TEST_F(LocationTest, FollowsTheUseMyLocationSetting)
 {
-    ASSERT_EQ(vconf_set_int(VCONFKEY_LOCATION_USE_MY_LOCATION, 1), VCONF_OK);
-    // GPS alone does not count: the combined method is what is asked.
-    ASSERT_EQ(vconf_set_int(VCONFKEY_LOCATION_ENABLED, 0), VCONF_OK);
-    EXPECT_TRUE(Location().IsLocationEnabled());
-    EXPECT_TRUE(mLog.Contains("enabled : 1", "weather-common"));
-}
-
-TEST_F(LocationTest, SwitchedOffIsFalseAndLogged)
-{
-    ASSERT_EQ(vconf_set_int(VCONFKEY_LOCATION_USE_MY_LOCATION, 0), VCONF_OK);
-    ASSERT_EQ(vconf_set_int(VCONFKEY_LOCATION_ENABLED, 1), VCONF_OK);
-    EXPECT_FALSE(Location().IsLocationEnabled());
-    EXPECT_TRUE(mLog.Contains("enabled : 0", "weather-common")) << mLog.Dump();
-    EXPECT_FALSE(mLog.Contains("location_manager_is_enabled_method failed"));
+    for (int useMyLocation : {1, 0})
+    {
+        mLog.Clear();
+        ASSERT_EQ(vconf_set_int(VCONFKEY_LOCATION_USE_MY_LOCATION, useMyLocation), VCONF_OK);
+        ASSERT_EQ(vconf_set_int(VCONFKEY_LOCATION_ENABLED, 1 - useMyLocation), VCONF_OK);
+        EXPECT_EQ(Location().IsLocationEnabled(), useMyLocation == 1);
+        EXPECT_TRUE(mLog.Contains("enabled : " + std::to_string(useMyLocation), "weather-common")) << mLog.Dump();
+        EXPECT_FALSE(mLog.Contains("location_manager_is_enabled_method failed"));
+    }
 }
 
 TEST_F(LocationTest, FailedQueryIsFalseWithTheCode)

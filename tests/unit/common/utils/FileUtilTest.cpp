@@ -39,27 +39,17 @@ protected:
     {
         // The caches are process-wide and every test has its own root.
         FileUtil::ClearCache();
-        const char* old = getenv("PLATFORM_APP_ID");
-        mHadAppId = old != nullptr;
-        if (old)
-            mOldAppId = old;
         setenv("PLATFORM_APP_ID", kWidgetId, 1);
     }
 
     void TearDown() override
     {
         FileUtil::ClearCache();
-        if (mHadAppId)
-            setenv("PLATFORM_APP_ID", mOldAppId.c_str(), 1);
-        else
-            unsetenv("PLATFORM_APP_ID");
+        unsetenv("PLATFORM_APP_ID");
     }
 
     std::string WeatherAppDir() const { return mRoot.Path("apps/com.quorvex.weather-m"); }
     std::string WidgetResDir() const { return mRoot.Path("apps/com.quorvex.weather-m-widget/res/"); }
-
-    bool mHadAppId = false;
-    std::string mOldAppId;
 };
 
 TEST_F(FileUtilTest, DatabasePathsLieInTheSharedDataDirectory)
