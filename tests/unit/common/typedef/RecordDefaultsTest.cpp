@@ -1,5 +1,4 @@
 #include "City.h"
-#include "Setting.h"
 #include "ShareTarget.h"
 
 #include <gtest/gtest.h>
@@ -119,33 +118,9 @@ TEST(RecordDefaultsTest, FreshExtraReads999ExceptAirDust)
     EXPECT_DOUBLE_EQ(precipitation->GetPrecAmountNight(), 999.0);
 }
 
-TEST(RecordDefaultsTest, FreshSettingIsCelsiusAutoRefreshEverySixHours)
+// The settings defaults are checked through the default row the store writes.
+TEST(RecordDefaultsTest, FreshShareTargetIsEmpty)
 {
-    Setting setting;
-    EXPECT_EQ(setting.GetTemperatureUnit(), 1);
-    EXPECT_TRUE(setting.GetAutoRefreshOn());
-    EXPECT_EQ(setting.GetAutoRefreshInterval(), 6);
-    EXPECT_TRUE(setting.GetIsFirstLaunch());
-    EXPECT_EQ(setting.GetCpType(), "Accuweather");
-    EXPECT_EQ(setting.GetDaemonType(), "RI_DAEMON");
-    EXPECT_EQ(setting.GetLastUpdateLanguageCode(), "en");
-    EXPECT_EQ(setting.GetCurrentCityLocationId(), "");
-
-    const bool flags[] = {
-        setting.GetUseCurrentLocationOn(), setting.GetShowCurrentCityAgreement(),
-        setting.GetRefreshOnOpeningOn(), setting.GetRefreshOnOpeningOnAgreement(),
-        setting.GetNotificationOn(), setting.GetNetworkPositionPopupAgreement(),
-        setting.GetShowNetworkPopup(), setting.GetChinaDataGPSPerformPopupOn(),
-        setting.GetAutoScrollOn(), setting.GetIsNowRefreshing(), setting.GetIsSupportManualRefresh()};
-    for (bool flag : flags)
-        EXPECT_FALSE(flag);
-    const long long numbers[] = {
-        setting.GetCurrentCityIndex(), setting.GetLastRefreshedTime(),
-        setting.GetCurrentLocationAreaRefreshedTime(), setting.GetNotificationTime(),
-        setting.GetAutoScrollInterval(), setting.GetRefreshingStartTime()};
-    for (long long number : numbers)
-        EXPECT_EQ(number, 0);
-
     ShareTarget target;
     EXPECT_EQ(target.GetAppID(), "");
     EXPECT_EQ(target.GetPortID(), "");

@@ -46,7 +46,6 @@ TEST_F(AppPathsTest, UnknownOrUnsafeIdsFail)
 
 TEST_F(AppPathsTest, ResourcePathFollowsOwnId)
 {
-    unsetenv("PLATFORM_APP_ID");
     setenv("PLATFORM_APP_ID", "com.quorvex.weather-m-widget", 1);
     EXPECT_EQ(Take(app_get_resource_path()), mRoot.Path("apps/com.quorvex.weather-m-widget/res/"));
     char* id = nullptr;

@@ -26,20 +26,16 @@ TEST_F(DlogTest, AppendsPhoneFormatLinesToRootLog)
     EXPECT_EQ(content, "E/weather-common(" + pid + "): value 42\nI/other(" + pid + "): second\n");
 }
 
-TEST_F(DlogTest, CaptureSeesTagAndText)
+TEST_F(DlogTest, CaptureSeesTagAndWholeText)
 {
+    std::string longText(5000, 'x');
     dlog_print(DLOG_ERROR, "weather-widget", "hello %s", "world");
-    ASSERT_EQ(mLog.GetLines().size(), 1u);
+    EXPECT_EQ(dlog_print(DLOG_INFO, "t", "%s", longText.c_str()), 5000);
+    ASSERT_EQ(mLog.GetLines().size(), 2u);
     EXPECT_EQ(mLog.GetLines()[0].tag, "weather-widget");
     EXPECT_EQ(mLog.GetLines()[0].text, "hello world");
     EXPECT_EQ(mLog.GetLines()[0].prio, DLOG_ERROR);
-}
-
-TEST_F(DlogTest, LongTextIsKeptWhole)
-{
-    std::string longText(5000, 'x');
-    EXPECT_EQ(dlog_print(DLOG_ERROR, "t", "%s", longText.c_str()), 5000);
-    EXPECT_EQ(mLog.GetLines().at(0).text, longText);
+    EXPECT_EQ(mLog.GetLines()[1].text, longText);
 }
 
 TEST_F(DlogTest, RejectsBadArguments)
