@@ -223,17 +223,14 @@ int AppLauncher::LaunchGPSSetting()
 
 void AppLauncher::ReplyCB(app_control_h request, app_control_h reply, app_control_result_e, void* userData)
 {
-    auto* pThis = static_cast<AppLauncher*>(userData);
-    UI_COMMON_RET_IF(pThis == NULL);
-    try
-    {
-        if (pThis->mReplyListener)
-            pThis->mReplyListener->OnAppControlReply(request, reply);
-    }
-    catch (...)
-    {
-        UI_COMMON_LOG("exception in the launch reply");
-    }
+    ForwardCallback<AppLauncher>(
+        userData,
+        [request, reply](AppLauncher& launcher)
+        {
+            if (launcher.mReplyListener)
+                launcher.mReplyListener->OnAppControlReply(request, reply);
+        },
+        UI_COMMON_CALLBACK_SITE);
 }
 
 }  // namespace NSWeather

@@ -1,10 +1,7 @@
 #include "ChangeableTheme.h"
 
-#include <algorithm>
-#include <exception>
-#include <vector>
-
 #include "FileUtil.h"
+#include "ListenerList.h"
 #include "UICommonLog.h"
 
 namespace NSWeather
@@ -18,16 +15,12 @@ const char* const COLOR_TABLE_FILE = "changeableColorInfo.xml";
 const char* const FONT_TABLE_FILE = "changeableColorInfo_font.xml";
 
 // Theme objects between InitChangeableTheme and DeinitChangeableTheme.
-std::vector<ChangeableTheme*>& LiveThemes()
+// Every theme object with the theme key registered; a handler may end
+// another theme object, which then is not called.
+ListenerList<ChangeableTheme*>& LiveThemes()
 {
-    static std::vector<ChangeableTheme*> themes;
+    static ListenerList<ChangeableTheme*> themes;
     return themes;
-}
-
-bool IsLive(ChangeableTheme* theme)
-{
-    const auto& themes = LiveThemes();
-    return std::find(themes.begin(), themes.end(), theme) != themes.end();
 }
 
 std::string MakeTablePath(const char* fileName)
@@ -129,37 +122,14 @@ void ChangeableTheme::UnloadTablesQuietly()
 void ChangeableTheme::OnThemeChangedCb(keynode_t* node, void* data)
 {
     (void)node;
-    auto* pThis = static_cast<ChangeableTheme*>(data);
-    UI_COMMON_RET_IF(pThis == NULL);
-    try
-    {
-        pThis->OnThemeChanged();
-    }
-    catch (const std::exception& e)
-    {
-        UI_COMMON_LOG("exception caught: %s", e.what());
-    }
-    catch (...)
-    {
-        UI_COMMON_LOG("unknown exception caught");
-    }
+    ForwardCallback<ChangeableTheme>(
+        data, [](ChangeableTheme& theme) { theme.OnThemeChanged(); }, UI_COMMON_CALLBACK_SITE);
 }
 
 void ChangeableTheme::ThemeKeyChangedCb(keynode_t* node, void* data)
 {
     (void)data;
-    try
-    {
-        // A handler may end another theme object; call only the live ones.
-        std::vector<ChangeableTheme*> themes = LiveThemes();
-        for (ChangeableTheme* theme : themes)
-            if (IsLive(theme))
-                OnThemeChangedCb(node, theme);
-    }
-    catch (...)
-    {
-        UI_COMMON_LOG("exception caught while dispatching a theme change");
-    }
+    LiveThemes().Notify([node](ChangeableTheme* theme) { OnThemeChangedCb(node, theme); });
 }
 
 void ChangeableTheme::OnThemeChanged()
@@ -177,12 +147,12 @@ void ChangeableTheme::RegisterThemeKey()
     if (mIsThemeKeyRegistered)
         return;
     auto& themes = LiveThemes();
-    if (themes.empty())
+    if (themes.IsEmpty())
     {
         int ret = vconf_notify_key_changed(THEME_KEY, ThemeKeyChangedCb, nullptr);
         UI_COMMON_RET_IF(ret != VCONF_OK);
     }
-    themes.push_back(this);
+    themes.Add(this);
     mIsThemeKeyRegistered = true;
 }
 
@@ -191,9 +161,9 @@ void ChangeableTheme::UnregisterThemeKey()
     if (!mIsThemeKeyRegistered)
         return;
     auto& themes = LiveThemes();
-    themes.erase(std::remove(themes.begin(), themes.end(), this), themes.end());
+    themes.Remove(this);
     mIsThemeKeyRegistered = false;
-    if (themes.empty() && vconf_ignore_key_changed(THEME_KEY, ThemeKeyChangedCb) != VCONF_OK)
+    if (themes.IsEmpty() && vconf_ignore_key_changed(THEME_KEY, ThemeKeyChangedCb) != VCONF_OK)
         UI_COMMON_LOG("vconf_ignore_key_changed failed");
 }
 

@@ -131,16 +131,9 @@ std::string QuorvexLogManager::GetUri(int uriType)
 
 void QuorvexLogManager::OnQuorvexLogManagerInsertCb(int requestId, const char* uri, void* userData)
 {
-    auto* pThis = static_cast<QuorvexLogManager*>(userData);
-    COMMON_RET_IF(pThis == NULL);
-    try
-    {
-        pThis->OnInsertCompleted(requestId, uri);
-    }
-    catch (...)
-    {
-        COMMON_LOG("exception in the usage-log completion");
-    }
+    ForwardCallback<QuorvexLogManager>(
+        userData, [requestId, uri](QuorvexLogManager& manager) { manager.OnInsertCompleted(requestId, uri); },
+        COMMON_CALLBACK_SITE);
 }
 
 void QuorvexLogManager::OnInsertCompleted(int requestId, const char* uri)

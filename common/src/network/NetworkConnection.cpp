@@ -9,9 +9,7 @@
 namespace NSWeather
 {
 
-NetworkConnection::NetworkConnection() : mConnection(nullptr), mEventListener(nullptr), mUserData(nullptr)
-{
-}
+NetworkConnection::NetworkConnection() : mConnection(nullptr), mEventListener(nullptr), mUserData(nullptr) {}
 
 NetworkConnection::~NetworkConnection()
 {
@@ -59,8 +57,10 @@ bool NetworkConnection::IsNetworkAvailable()
         }
         if (type == CONNECTION_TYPE_DISCONNECTED || type == CONNECTION_TYPE_BT)
         {
-            COMMON_LOG("[%s(): %d] connection type disconnected or bt connection. network connection type:%d [break]",
-                       __func__, __LINE__, type);
+            COMMON_LOG(
+                "[%s(): %d] connection type disconnected or bt connection. network connection type:%d "
+                "[break]",
+                __func__, __LINE__, type);
             break;
         }
         isAvailable = true;
@@ -92,20 +92,9 @@ int NetworkConnection::SetNetworkConnectionStateChangedCb(NetworkConnectionState
 
 void NetworkConnection::NetworkStateChangedCb(connection_type_e type, void* userData)
 {
-    NetworkConnection* pThis = static_cast<NetworkConnection*>(userData);
-    COMMON_RET_IF(pThis == NULL);
-    try
-    {
-        pThis->OnNetworkStateChanged(type);
-    }
-    catch (const std::exception& e)
-    {
-        COMMON_LOG("exception caught: %s", e.what());
-    }
-    catch (...)
-    {
-        COMMON_LOG("exception caught");
-    }
+    ForwardCallback<NetworkConnection>(
+        userData, [type](NetworkConnection& connection) { connection.OnNetworkStateChanged(type); },
+        COMMON_CALLBACK_SITE);
 }
 
 void NetworkConnection::OnNetworkStateChanged(connection_type_e type)
