@@ -4,7 +4,6 @@
 #include <functional>
 #include <string>
 
-#include "QueryGenernator.h"
 #include "Setting.h"
 
 namespace NSWeather
@@ -13,8 +12,9 @@ namespace NSWeather
 class DBStatement;
 
 // The one settings row that the suite's processes share ("db/.setting.db").
-// Select, Update and UpdateLocationIdOfDisplayCity run their own cycle;
-// CreateTable, Insert and IsSettingTableExist run on the caller's.
+// Select, Update, SelectAndUpdate and UpdateLocationIdOfDisplayCity run
+// their own cycle; CreateTable, Insert and IsSettingTableExist run on the
+// caller's. Writers return ERR_OK, or ERR_FAIL with nothing written.
 class SettingDBController
 {
 public:
@@ -25,11 +25,11 @@ public:
     // ERR_OK, or ERR_FAIL when the database cannot be opened or takes no row.
     int Initialize();
     bool IsSettingTableExist();
-    void CreateTable();
-    void Insert(const SettingPtr& settingPtr);
+    bool CreateTable();
+    int Insert(const SettingPtr& settingPtr);
     // Rewrites the whole row from the record; a null record writes nothing.
-    void Update(const SettingPtr& settingPtr);
-    void UpdateLocationIdOfDisplayCity(const std::string& locationId);
+    int Update(const SettingPtr& settingPtr);
+    int UpdateLocationIdOfDisplayCity(const std::string& locationId);
     // Null when there is no row or the database cannot be read.
     SettingPtr Select();
     // Reads the row, lets `change` edit it and writes it back whole, in one
@@ -46,8 +46,6 @@ private:
     static SettingPtr ReadSetting(const DBStatement& statement);
     SettingPtr SelectRow();
     bool UpdateRow(const SettingPtr& settingPtr);
-
-    QueryGenernator mQueryGenernator;
 };
 
 }  // namespace NSWeather

@@ -21,7 +21,7 @@ DBConnector* DBConnector::GetInstance()
     return instance;
 }
 
-DBConnector::DBConnector() : mDBHandle(nullptr), mIsCycleFailed(false) {}
+DBConnector::DBConnector() : mDBHandle(nullptr), mIsCycleFailed(false), mIsImmediate(false) {}
 
 DBConnector::~DBConnector()
 {
@@ -30,19 +30,17 @@ DBConnector::~DBConnector()
 
 bool DBConnector::DBInitialize(const std::string& dbFilePath, bool isReadOnly)
 {
-    if (isReadOnly)
-        return DBOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY, "BEGIN TRANSACTION;");
-    return DBOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE,
-                  "BEGIN TRANSACTION;");
+    mIsImmediate = false;
+    return DBOpen(dbFilePath, isReadOnly);
 }
 
 bool DBConnector::DBInitializeImmediate(const std::string& dbFilePath)
 {
-    return DBOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE,
-                  "BEGIN IMMEDIATE TRANSACTION;");
+    mIsImmediate = true;
+    return DBOpen(dbFilePath, false);
 }
 
-bool DBConnector::DBOpen(const std::string& dbFilePath, int openFlags, const char* beginQuery)
+bool DBConnector::DBOpen(const std::string& dbFilePath, bool isReadOnly)
 {
     if (mDBHandle)
     {
@@ -50,24 +48,30 @@ bool DBConnector::DBOpen(const std::string& dbFilePath, int openFlags, const cha
         return true;
     }
     COMMON_RETV_IF(dbFilePath.empty(), false);
-    COMMON_RETV_IF(DBFileOpen(dbFilePath, openFlags) == false, false);
+    if (isReadOnly)
+        COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY) == false,
+                       false);
+    else
+        COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READWRITE |
+                                                  SQLITE_OPEN_CREATE) == false,
+                       false);
     COMMON_RETV_IF(DBSetBusyHandler() == false, false);
     COMMON_RETV_IF(DBExcutePerformanceOptimization() == false, false);
-    COMMON_RETV_IF(DBStartTransaction(beginQuery) == false, false);
+    COMMON_RETV_IF(DBStartTransaction() == false, false);
     mIsCycleFailed = false;
     return true;
 }
 
 bool DBConnector::DBFinalize()
 {
+    COMMON_RETV_IF(DBEndTransaction() == false, false);
     if (!mDBHandle)
     {
         COMMON_LOG("mDBHandle is NULL");
         return false;
     }
-    bool isCommitted = DBEndTransaction();
     DBClose();
-    return isCommitted;
+    return true;
 }
 
 sqlite3_stmt* DBConnector::DBPrepareQuery(const char* query)
@@ -166,12 +170,16 @@ bool DBConnector::DBExcutePerformanceOptimization()
     return true;
 }
 
-bool DBConnector::DBStartTransaction(const char* beginQuery)
+// The immediate form takes the write lock at once (waiting through the busy
+// handler) instead of at the first write.
+bool DBConnector::DBStartTransaction()
 {
+    const char* beginQuery = mIsImmediate ? "BEGIN IMMEDIATE TRANSACTION;" : "BEGIN TRANSACTION;";
     int rc = sqlite3_exec(mDBHandle, beginQuery, nullptr, nullptr, nullptr);
     if (rc != SQLITE_OK)
     {
-        COMMON_LOG("Fail: %s rc [%d][%s]", beginQuery, rc, sqlite3_errmsg(mDBHandle));
+        COMMON_LOG("sqlite3_exec fail");
+        COMMON_LOG("%s rc [%d][%s]", beginQuery, rc, sqlite3_errmsg(mDBHandle));
         DBClose();
         return false;
     }
@@ -183,17 +191,22 @@ bool DBConnector::DBStartTransaction(const char* beginQuery)
 // transaction for the next cycle to inherit.
 bool DBConnector::DBEndTransaction()
 {
+    if (!mDBHandle)
+        return true;
     if (mIsCycleFailed)
     {
         COMMON_LOG("A step of this cycle failed: rolled back");
         sqlite3_exec(mDBHandle, "ROLLBACK;", nullptr, nullptr, nullptr);
+        DBClose();
         return false;
     }
     int rc = sqlite3_exec(mDBHandle, "END TRANSACTION;", nullptr, nullptr, nullptr);
     if (rc != SQLITE_OK)
     {
-        COMMON_LOG("Fail: END TRANSACTION rc [%d][%s]", rc, sqlite3_errmsg(mDBHandle));
+        COMMON_LOG("sqlite3_exec fail");
+        COMMON_LOG("END TRANSACTION rc [%d][%s]", rc, sqlite3_errmsg(mDBHandle));
         sqlite3_exec(mDBHandle, "ROLLBACK;", nullptr, nullptr, nullptr);
+        DBClose();
         return false;
     }
     return true;

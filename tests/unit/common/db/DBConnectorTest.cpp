@@ -57,7 +57,8 @@ TEST_F(DBConnectorTest, EmptyAndMissingPaths)
     std::string missing = DBDir() + "/missing.db";
     EXPECT_FALSE(mConnector->DBInitialize(missing, true));
     EXPECT_TRUE(mLog.Contains("sqlite3_open_open failed."));
-    EXPECT_TRUE(mLog.Contains("(DBFileOpen(dbFilePath, openFlags) == false)"));
+    EXPECT_TRUE(
+        mLog.Contains("(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY) == false)"));
     EXPECT_FALSE(mConnector->GetIsOpened());
     EXPECT_FALSE(FileExists(missing));
 
@@ -119,7 +120,7 @@ TEST_F(DBConnectorTest, FailedCommitClosesTheConnector)
     ASSERT_TRUE(mConnector->DBInitialize(WeatherDBPath(), false));
     EXPECT_TRUE(mConnector->DBExecuteQuery("COMMIT;"));
     EXPECT_FALSE(mConnector->DBFinalize());
-    EXPECT_TRUE(mLog.Contains("Fail: END TRANSACTION rc [1][cannot commit - no transaction is active]"));
+    EXPECT_TRUE(mLog.Contains("(DBEndTransaction() == false) [return]"));
     EXPECT_FALSE(mConnector->GetIsOpened());
 
     EXPECT_FALSE(mConnector->DBFinalize());

@@ -121,12 +121,10 @@ TEST_F(SettingDBControllerTest, NullRecordWritesNothingAndDisplayCityWritesOneCo
 TEST_F(SettingDBControllerTest, MissingDatabaseIsNeitherReadNorCreated)
 {
     EXPECT_EQ(ERR_FAIL, SettingDBController().Initialize());
-    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetSettingDBFilePath(), false) == false"))
-        << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("/.setting.db for writing")) << mLog.Dump();
     MakeDBDir();
     EXPECT_FALSE(SettingDBController().Select());
-    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetSettingDBFilePath(), true) == false"))
-        << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("/.setting.db for reading")) << mLog.Dump();
     EXPECT_FALSE(SettingsTest::FileExists(SettingDBPath()));
 }
 

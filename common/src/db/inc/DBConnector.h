@@ -32,6 +32,8 @@ public:
     sqlite3_stmt* DBPrepareQuery(const char* query);
     bool DBExecuteQuery(const char* query);
     bool GetIsOpened() const { return mDBHandle != nullptr; }
+    // SQLite's result code of the last failed call on the open handle.
+    int GetLastErrorCode() const { return mDBHandle ? sqlite3_errcode(mDBHandle) : SQLITE_MISUSE; }
 
     static int DBUtilBusyHandler(void* userData, int count);
 
@@ -43,13 +45,14 @@ private:
     bool DBFileOpen(const std::string& dbFilePath, int openFlags);
     bool DBSetBusyHandler();
     bool DBExcutePerformanceOptimization();
-    bool DBOpen(const std::string& dbFilePath, int openFlags, const char* beginQuery);
-    bool DBStartTransaction(const char* beginQuery);
+    bool DBOpen(const std::string& dbFilePath, bool isReadOnly);
+    bool DBStartTransaction();
     bool DBEndTransaction();
     void DBClose();
 
     sqlite3* mDBHandle;
     bool mIsCycleFailed;
+    bool mIsImmediate;
 };
 
 }  // namespace NSWeather
