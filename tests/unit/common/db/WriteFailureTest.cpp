@@ -2,7 +2,6 @@
 #include <fstream>
 #include <functional>
 
-#include <sqlite3.h>
 #include <sys/resource.h>
 #include <sys/wait.h>
 #include <unistd.h>
@@ -124,36 +123,12 @@ TEST_F(WriteFailureTest, LockHeldByAnotherProcess)
     std::string before = Snapshot();
     for (const char* lock : {"BEGIN EXCLUSIVE;", "BEGIN IMMEDIATE;"})
     {
-        int ready[2];
-        int release[2];
-        ASSERT_EQ(0, pipe(ready));
-        ASSERT_EQ(0, pipe(release));
-        pid_t pid = fork();
-        ASSERT_GE(pid, 0);
-        if (pid == 0)
-        {
-            sqlite3* weather = nullptr;
-            sqlite3* setting = nullptr;
-            char byte = 'r';
-            bool isLocked = sqlite3_open(WeatherDBPath().c_str(), &weather) == SQLITE_OK &&
-                            sqlite3_open(SettingDBPath().c_str(), &setting) == SQLITE_OK &&
-                            sqlite3_exec(weather, lock, nullptr, nullptr, nullptr) == SQLITE_OK &&
-                            sqlite3_exec(setting, lock, nullptr, nullptr, nullptr) == SQLITE_OK;
-            if (!isLocked || write(ready[1], &byte, 1) != 1 || read(release[0], &byte, 1) != 1)
-                _exit(2);
-            _exit(0);
-        }
-        char byte = 0;
-        ASSERT_EQ(1, read(ready[0], &byte, 1));
+        WeatherTest::LockHolder holder({WeatherDBPath(), SettingDBPath()}, lock, 60000);
+        ASSERT_TRUE(holder.GetIsLocked()) << lock;
         DBConnector::SetBusyRetryLimit(1);
         Names succeeded = RunWriters();
         DBConnector::SetBusyRetryLimit(-1);
-        EXPECT_EQ(1, write(release[1], &byte, 1));
-        int status = -1;
-        ASSERT_EQ(pid, waitpid(pid, &status, 0));
-        for (int fd : {ready[0], ready[1], release[0], release[1]}) close(fd);
-        ASSERT_TRUE(WIFEXITED(status) && WEXITSTATUS(status) == 0) << lock;
-
+        holder.Release();
         EXPECT_EQ(Names(), succeeded) << lock;
         EXPECT_EQ(before, Snapshot()) << lock;
     }
