@@ -1,7 +1,6 @@
 #include "DBStatement.h"
 
-#include <cmath>
-
+#include "CommonLog.h"
 #include "DBConnector.h"
 
 namespace NSWeather
@@ -35,22 +34,34 @@ bool DBStatement::BindDouble(int index, double value)
 
 bool DBStatement::BindText(int index, const std::string& value)
 {
-    return mStmt &&
-           sqlite3_bind_text(mStmt, index, value.c_str(), static_cast<int>(value.size()), SQLITE_TRANSIENT) ==
-               SQLITE_OK;
-}
-
-bool DBStatement::BindTemperature(int index, const TemperaturePtr& temperature)
-{
-    double celsius = temperature ? temperature->GetCelsius() : 999.0;
-    return BindDouble(index, std::floor(0.5 + celsius * 10) / 10);
+    return mStmt && sqlite3_bind_text(mStmt, index, value.c_str(), static_cast<int>(value.size()),
+                                      SQLITE_TRANSIENT) == SQLITE_OK;
 }
 
 int DBStatement::Step()
 {
     if (!mStmt)
         return SQLITE_MISUSE;
-    return sqlite3_step(mStmt);
+    int rc = sqlite3_step(mStmt);
+    if (rc != SQLITE_ROW && rc != SQLITE_DONE)
+    {
+        sqlite3* handle = sqlite3_db_handle(mStmt);
+        COMMON_LOG("Fail: sqlite3_step rc [%d][%s]", rc, sqlite3_errmsg(handle));
+        COMMON_LOG("Query: %s", sqlite3_sql(mStmt));
+        DBConnector::GetInstance()->MarkCycleFailed();
+    }
+    return rc;
+}
+
+bool DBStatement::Execute()
+{
+    if (!mStmt)
+    {
+        // The prepare failure is already logged.
+        DBConnector::GetInstance()->MarkCycleFailed();
+        return false;
+    }
+    return Step() == SQLITE_DONE;
 }
 
 void DBStatement::Reset()
@@ -85,13 +96,6 @@ std::string DBStatement::ColumnText(int column) const
         return std::string();
     int bytes = sqlite3_column_bytes(mStmt, column);
     return std::string(reinterpret_cast<const char*>(text), static_cast<size_t>(bytes));
-}
-
-TemperaturePtr DBStatement::ColumnTemperature(int column) const
-{
-    TemperaturePtr temperature = std::make_shared<Temperature>();
-    temperature->SetCelsiusValue(ColumnDouble(column));
-    return temperature;
 }
 
 }  // namespace NSWeather

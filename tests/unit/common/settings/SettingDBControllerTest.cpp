@@ -1,5 +1,6 @@
 #include <sstream>
 
+#include <sqlite3.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -72,7 +73,7 @@ TEST_F(SettingDBControllerTest, EveryColumnRoundTrips)
     s->SetDaemonType("OTHER_DAEMON");
     s->SetIsSupportManualRefresh(true);
     s->SetRefreshingStartTime(2000000004);
-    SettingDBController().Update(s);
+    ASSERT_EQ(ERR_OK, SettingDBController().Update(s));
     SettingPtr read = SettingDBController().Select();
     ASSERT_TRUE(read);
     EXPECT_EQ(Describe(*s), Describe(*read));
@@ -83,7 +84,7 @@ TEST_F(SettingDBControllerTest, EveryColumnRoundTrips)
                       &Setting::SetNetworkPositionPopupAgreement, &Setting::SetChinaDataGPSPerformPopupOn,
                       &Setting::SetIsNowRefreshing})
         ((*s).*flip)(flip != &Setting::SetAutoRefreshOn);
-    SettingDBController().Update(s);
+    ASSERT_EQ(ERR_OK, SettingDBController().Update(s));
     EXPECT_EQ(Describe(*s), Describe(*SettingDBController().Select()));
     EXPECT_EQ(1, RawDB(SettingDBPath()).QueryInt("SELECT COUNT(*) FROM SETTING_TABLE"));
 }
@@ -106,11 +107,11 @@ TEST_F(SettingDBControllerTest, NullRecordWritesNothingAndDisplayCityWritesOneCo
     InitializeSettings();
     SetSettingColumn("CpType", "'Kweather'");
     std::string before = WeatherTest::ReadText(SettingDBPath());
-    SettingDBController().Update(nullptr);
+    EXPECT_EQ(ERR_FAIL, SettingDBController().Update(nullptr));
     EXPECT_EQ(before, WeatherTest::ReadText(SettingDBPath()));
     EXPECT_TRUE(mLog.Contains("(!settingPtr) [return]")) << mLog.Dump();
 
-    SettingDBController().UpdateLocationIdOfDisplayCity("2-226396_1_AL");
+    EXPECT_EQ(ERR_OK, SettingDBController().UpdateLocationIdOfDisplayCity("2-226396_1_AL"));
     SettingPtr read = SettingDBController().Select();
     ASSERT_TRUE(read);
     EXPECT_EQ("2-226396_1_AL", read->GetCurrentCityLocationId());
@@ -120,75 +121,72 @@ TEST_F(SettingDBControllerTest, NullRecordWritesNothingAndDisplayCityWritesOneCo
 TEST_F(SettingDBControllerTest, MissingDatabaseIsNeitherReadNorCreated)
 {
     EXPECT_EQ(ERR_FAIL, SettingDBController().Initialize());
-    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetSettingDBFilePath(), false) == false"))
-        << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("/.setting.db for writing")) << mLog.Dump();
     MakeDBDir();
     EXPECT_FALSE(SettingDBController().Select());
-    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetSettingDBFilePath(), true) == false"))
-        << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("/.setting.db for reading")) << mLog.Dump();
     EXPECT_FALSE(SettingsTest::FileExists(SettingDBPath()));
 }
 
-// A child process that reads the row, waits for its turn, changes it with
-// `change` and writes the whole row back.
-struct Writer
-{
-    pid_t pid = -1;
-    int ready[2] = {-1, -1};
-    int go[2] = {-1, -1};
-
-    void Start(void (*change)(Setting&))
-    {
-        ASSERT_EQ(0, pipe(ready));
-        ASSERT_EQ(0, pipe(go));
-        pid = fork();
-        ASSERT_GE(pid, 0);
-        if (pid == 0)
-        {
-            SettingPtr settingPtr = SettingDBController().Select();
-            char byte = 'r';
-            if (!settingPtr || write(ready[1], &byte, 1) != 1 || read(go[0], &byte, 1) != 1)
-                _exit(2);
-            change(*settingPtr);
-            SettingDBController().Update(settingPtr);
-            _exit(0);
-        }
-        char byte = 0;
-        ASSERT_EQ(1, read(ready[0], &byte, 1));
-    }
-
-    int Finish()
-    {
-        char byte = 'g';
-        int status = -1;
-        bool ok = write(go[1], &byte, 1) == 1 && waitpid(pid, &status, 0) == pid;
-        for (int fd : {ready[0], ready[1], go[0], go[1]}) close(fd);
-        return ok && WIFEXITED(status) ? WEXITSTATUS(status) : -1;
-    }
-};
-
-TEST_F(SettingDBControllerTest, LaterWriterOfTwoProcessesWinsEveryColumn)
+// Another process writes one column while the read-change-write is between
+// its read and its write: that write waits for the lock and survives.
+TEST_F(SettingDBControllerTest, ReadChangeWriteDoesNotUndoAWriteOfAnotherProcess)
 {
     InitializeSettings();
-    Writer first;
-    Writer second;
-    first.Start(
-        [](Setting& s)
+    int go[2];
+    int blocked[2];
+    ASSERT_EQ(0, pipe(go));
+    ASSERT_EQ(0, pipe(blocked));
+    pid_t pid = fork();
+    ASSERT_GE(pid, 0);
+    if (pid == 0)
+    {
+        char byte = 0;
+        sqlite3* db = nullptr;
+        if (read(go[0], &byte, 1) != 1 || sqlite3_open(SettingDBPath().c_str(), &db) != SQLITE_OK)
+            _exit(2);
+        // Says once that the write is held back, then keeps retrying.
+        auto onBusy = [](void* fd, int count) -> int
         {
-            s.SetTemperatureUnit(0);
-            s.SetCpType("Kweather");
+            char b = 'b';
+            if (count == 0 && write(*static_cast<int*>(fd), &b, 1) != 1)
+                return 0;
+            usleep(20000);
+            return count < 500;
+        };
+        sqlite3_busy_handler(db, onBusy, &blocked[1]);
+        int rc =
+            sqlite3_exec(db, "UPDATE SETTING_TABLE SET CpType = 'cmaweather';", nullptr, nullptr, nullptr);
+        sqlite3_close(db);
+        _exit(rc == SQLITE_OK ? 0 : 3);
+    }
+    SettingPtr written = SettingDBController().SelectAndUpdate(
+        [&](const SettingPtr& s)
+        {
+            s->SetTemperatureUnit(0);
+            char byte = 'g';
+            ASSERT_EQ(1, write(go[1], &byte, 1));
+            ASSERT_EQ(1, read(blocked[0], &byte, 1));
         });
-    second.Start([](Setting& s) { s.SetCpType("cmaweather"); });
-    EXPECT_EQ(0, first.Finish());
-    EXPECT_EQ("Kweather", SettingDBController().Select()->GetCpType());
-    EXPECT_EQ(0, second.Finish());
-
-    // The second read the row before the first wrote: the unit change is gone.
+    int status = -1;
+    ASSERT_EQ(pid, waitpid(pid, &status, 0));
+    for (int fd : {go[0], go[1], blocked[0], blocked[1]}) close(fd);
+    EXPECT_TRUE(WIFEXITED(status) && WEXITSTATUS(status) == 0) << status;
+    ASSERT_TRUE(written);
+    EXPECT_EQ(0, written->GetTemperatureUnit());
     SettingPtr read = SettingDBController().Select();
     ASSERT_TRUE(read);
+    EXPECT_EQ(0, read->GetTemperatureUnit());
     EXPECT_EQ("cmaweather", read->GetCpType());
-    EXPECT_EQ(1, read->GetTemperatureUnit());
-    EXPECT_EQ(1, RawDB(SettingDBPath()).QueryInt("SELECT COUNT(*) FROM SETTING_TABLE"));
+}
+
+TEST_F(SettingDBControllerTest, ReadChangeWriteWithoutARowWritesNothing)
+{
+    MakeDBDir();
+    bool isCalled = false;
+    EXPECT_FALSE(SettingDBController().SelectAndUpdate([&](const SettingPtr&) { isCalled = true; }));
+    EXPECT_FALSE(isCalled);
+    EXPECT_FALSE(SettingDBController().SelectAndUpdate(nullptr));
 }
 
 }  // namespace
