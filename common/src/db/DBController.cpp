@@ -85,8 +85,7 @@ CityPtr DBController::SelectDataWithPrimaryKey(CityDBController& cityDBControlle
 CityPtrVectorPtr DBController::SelectAllCities(CityDBController& cityDBController)
 {
     CityPtrVectorPtr cityPtrVector = std::make_shared<CityPtrVector>();
-    int count = cityDBController.GetNumberOfCities();
-    if (count <= 0)
+    if (cityDBController.GetNumberOfCities() <= 0)
         return cityPtrVector;
     std::map<int, std::pair<int, CityPtr>> rowByPage;
     for (const auto& row : cityDBController.SelectAll())
@@ -96,15 +95,16 @@ CityPtrVectorPtr DBController::SelectAllCities(CityDBController& cityDBControlle
     std::map<int, HourlyPtrVectorPtr> hourlyMap = HourlyWeatherDBController().SelectAll();
     std::map<int, ExtraPtr> extraMap = ExtraWeatherDBController().SelectAll();
     std::map<int, MoonPhasePtrVectorPtr> moonPhaseMap = MoonPhaseDBController().SelectAll();
-    for (int pageIndex = 0; pageIndex < count; ++pageIndex)
+    // Every stored page in page order. A gap in the page indexes (another
+    // writer mid-change) is skipped, never filled with a null city, and the
+    // cities after it stay in the list: stopping at the row count would
+    // drop the last ones.
+    int expectedPageIndex = 0;
+    for (auto row = rowByPage.lower_bound(0); row != rowByPage.end(); ++row)
     {
-        auto row = rowByPage.find(pageIndex);
-        if (row == rowByPage.end())
-        {
-            // A gap in the page indexes (another writer mid-change) is skipped.
+        if (row->first != expectedPageIndex)
             COMMON_LOG("!cityPtr");
-            continue;
-        }
+        expectedPageIndex = row->first + 1;
         int primaryKey = row->second.first;
         CityPtr cityPtr = row->second.second;
         cityPtr->SetCurrentPtr(FindOr(currentMap, primaryKey, CurrentPtr()));

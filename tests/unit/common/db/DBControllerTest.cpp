@@ -451,9 +451,9 @@ TEST_F(DBControllerTest, ListSkipsMissingPagesAndTakesTheFirstOfADuplicate)
     RawDB(WeatherDBPath()).Exec("UPDATE CITY_TABLE SET pageIndex = 0 WHERE locationId = 'B';");
     EXPECT_EQ(PageOrder(), (std::vector<std::string>{"A@0", "C@2"}));
 
-    // A gap: C keeps page 2 at position 1; D (page 3) lies beyond the row
-    // count until a writer renumbers the pages.
+    // A gap: C keeps page 2 at position 1, and D (page 3), beyond the row
+    // count, is still listed.
     InsertCities({"D"});
     RawDB(WeatherDBPath()).Exec("DELETE FROM CITY_TABLE WHERE locationId = 'B';");
-    EXPECT_EQ(PageOrder(), (std::vector<std::string>{"A@0", "C@2"}));
+    EXPECT_EQ(PageOrder(), (std::vector<std::string>{"A@0", "C@2", "D@3"}));
 }
