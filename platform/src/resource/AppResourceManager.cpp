@@ -53,7 +53,7 @@ std::string OwnResourceDir()
     return dir;
 }
 
-std::string StripTypePrefix(app_resource_e type, const std::string& id)
+std::string StripTypePrefix(int type, const std::string& id)
 {
     std::string prefix = kTypePrefixes[type];
     if (id.compare(0, prefix.size(), prefix) == 0)
@@ -61,7 +61,7 @@ std::string StripTypePrefix(app_resource_e type, const std::string& id)
     return id;
 }
 
-int AppResourceManagerGet(app_resource_e type, const char* id, char** path)
+int AppResourceManagerGet(int type, const char* id, char** path)
 {
     if (type < APP_RESOURCE_TYPE_MIN || type > APP_RESOURCE_TYPE_MAX || !id || !path)
         return APP_RESOURCE_ERROR_INVALID_PARAMETER;
@@ -101,8 +101,10 @@ extern "C" int app_resource_manager_init(void)
 
 extern "C" int app_resource_manager_get(app_resource_e type, const char* id, char** path)
 {
+    // Read once as a number: callers may pass values outside the enum.
+    int rawType = type;
     return platform::GuardedCall(kLogTag, APP_RESOURCE_ERROR_OUT_OF_MEMORY,
-                                 [&] { return AppResourceManagerGet(type, id, path); });
+                                 [&] { return AppResourceManagerGet(rawType, id, path); });
 }
 
 extern "C" int app_resource_manager_release(void)
