@@ -62,17 +62,6 @@ TEST_F(ConnectionTest, StatusKeyNumberingMapsOntoConnectionTypes)
     }
 }
 
-TEST_F(ConnectionTest, ChangeOfStatusReachesCallbackWithNewType)
-{
-    std::vector<int> seen;
-    ASSERT_EQ(connection_set_type_changed_cb(mConnection, TypeChangedCb, &seen), CONNECTION_ERROR_NONE);
-    vconf_set_int(VCONFKEY_NETWORK_STATUS, VCONFKEY_NETWORK_CELLULAR);
-    ASSERT_TRUE(RunLoopUntil([&] { return seen.size() == 1; }, 5.0));
-    vconf_set_int(VCONFKEY_NETWORK_STATUS, VCONFKEY_NETWORK_OFF);
-    ASSERT_TRUE(RunLoopUntil([&] { return seen.size() == 2; }, 5.0));
-    EXPECT_EQ(seen, (std::vector<int>{CONNECTION_TYPE_CELLULAR, CONNECTION_TYPE_DISCONNECTED}));
-}
-
 TEST_F(ConnectionTest, OnlyANewTypeIsReported)
 {
     ASSERT_EQ(vconf_set_int(VCONFKEY_NETWORK_STATUS, VCONFKEY_NETWORK_WIFI), VCONF_OK);
