@@ -7,6 +7,7 @@
 
 #include "app_control/AppControlInternal.h"
 #include "app_control_launch.h"
+#include "core/ApiGuard.h"
 #include "core/PlatformRoot.h"
 #include "dlog.h"
 
@@ -93,7 +94,10 @@ bool AppControlFromBundle(const bundle* b, app_control_s& request)
 
 }  // namespace platform
 
-extern "C" int app_control_create(app_control_h* appControl)
+namespace
+{
+
+int AppControlCreate(app_control_h* appControl)
 {
     if (!appControl)
         return APP_CONTROL_ERROR_INVALID_PARAMETER;
@@ -101,7 +105,7 @@ extern "C" int app_control_create(app_control_h* appControl)
     return *appControl ? APP_CONTROL_ERROR_NONE : APP_CONTROL_ERROR_OUT_OF_MEMORY;
 }
 
-extern "C" int app_control_destroy(app_control_h appControl)
+int AppControlDestroy(app_control_h appControl)
 {
     if (!appControl)
         return APP_CONTROL_ERROR_INVALID_PARAMETER;
@@ -109,37 +113,37 @@ extern "C" int app_control_destroy(app_control_h appControl)
     return APP_CONTROL_ERROR_NONE;
 }
 
-extern "C" int app_control_set_operation(app_control_h appControl, const char* operation)
+int AppControlSetOperation(app_control_h appControl, const char* operation)
 {
     return SetText(appControl, operation, &app_control_s::hasOperation, &app_control_s::operation);
 }
 
-extern "C" int app_control_get_operation(app_control_h appControl, char** operation)
+int AppControlGetOperation(app_control_h appControl, char** operation)
 {
     return GetText(appControl, operation, &app_control_s::hasOperation, &app_control_s::operation);
 }
 
-extern "C" int app_control_set_uri(app_control_h appControl, const char* uri)
+int AppControlSetUri(app_control_h appControl, const char* uri)
 {
     return SetText(appControl, uri, &app_control_s::hasUri, &app_control_s::uri);
 }
 
-extern "C" int app_control_get_uri(app_control_h appControl, char** uri)
+int AppControlGetUri(app_control_h appControl, char** uri)
 {
     return GetText(appControl, uri, &app_control_s::hasUri, &app_control_s::uri);
 }
 
-extern "C" int app_control_set_app_id(app_control_h appControl, const char* appId)
+int AppControlSetAppId(app_control_h appControl, const char* appId)
 {
     return SetText(appControl, appId, &app_control_s::hasAppId, &app_control_s::appId);
 }
 
-extern "C" int app_control_get_app_id(app_control_h appControl, char** appId)
+int AppControlGetAppId(app_control_h appControl, char** appId)
 {
     return GetText(appControl, appId, &app_control_s::hasAppId, &app_control_s::appId);
 }
 
-extern "C" int app_control_add_extra_data(app_control_h appControl, const char* key, const char* value)
+int AppControlAddExtraData(app_control_h appControl, const char* key, const char* value)
 {
     if (!appControl || !key || !*key || !value || !*value)
         return APP_CONTROL_ERROR_INVALID_PARAMETER;
@@ -155,7 +159,7 @@ extern "C" int app_control_add_extra_data(app_control_h appControl, const char* 
     return result == BUNDLE_ERROR_NONE ? APP_CONTROL_ERROR_NONE : APP_CONTROL_ERROR_OUT_OF_MEMORY;
 }
 
-extern "C" int app_control_get_extra_data(app_control_h appControl, const char* key, char** value)
+int AppControlGetExtraData(app_control_h appControl, const char* key, char** value)
 {
     if (!appControl || !key || !value)
         return APP_CONTROL_ERROR_INVALID_PARAMETER;
@@ -166,8 +170,7 @@ extern "C" int app_control_get_extra_data(app_control_h appControl, const char* 
     return *value ? APP_CONTROL_ERROR_NONE : APP_CONTROL_ERROR_OUT_OF_MEMORY;
 }
 
-extern "C" int app_control_foreach_extra_data(app_control_h appControl, app_control_extra_data_cb callback,
-                                              void* userData)
+int AppControlForeachExtraData(app_control_h appControl, app_control_extra_data_cb callback, void* userData)
 {
     if (!appControl || !callback)
         return APP_CONTROL_ERROR_INVALID_PARAMETER;
@@ -179,7 +182,7 @@ extern "C" int app_control_foreach_extra_data(app_control_h appControl, app_cont
     return APP_CONTROL_ERROR_NONE;
 }
 
-extern "C" int app_control_get_launch_request(app_control_h* appControl)
+int AppControlGetLaunchRequest(app_control_h* appControl)
 {
     if (!appControl)
         return APP_CONTROL_ERROR_INVALID_PARAMETER;
@@ -201,4 +204,79 @@ extern "C" int app_control_get_launch_request(app_control_h* appControl)
     }
     *appControl = request.release();
     return APP_CONTROL_ERROR_NONE;
+}
+
+}  // namespace
+
+extern "C" int app_control_create(app_control_h* appControl)
+{
+    return platform::GuardedCall(platform::kAppControlLogTag, APP_CONTROL_ERROR_OUT_OF_MEMORY,
+                                 [&] { return AppControlCreate(appControl); });
+}
+
+extern "C" int app_control_destroy(app_control_h appControl)
+{
+    return platform::GuardedCall(platform::kAppControlLogTag, APP_CONTROL_ERROR_OUT_OF_MEMORY,
+                                 [&] { return AppControlDestroy(appControl); });
+}
+
+extern "C" int app_control_set_operation(app_control_h appControl, const char* operation)
+{
+    return platform::GuardedCall(platform::kAppControlLogTag, APP_CONTROL_ERROR_OUT_OF_MEMORY,
+                                 [&] { return AppControlSetOperation(appControl, operation); });
+}
+
+extern "C" int app_control_get_operation(app_control_h appControl, char** operation)
+{
+    return platform::GuardedCall(platform::kAppControlLogTag, APP_CONTROL_ERROR_OUT_OF_MEMORY,
+                                 [&] { return AppControlGetOperation(appControl, operation); });
+}
+
+extern "C" int app_control_set_uri(app_control_h appControl, const char* uri)
+{
+    return platform::GuardedCall(platform::kAppControlLogTag, APP_CONTROL_ERROR_OUT_OF_MEMORY,
+                                 [&] { return AppControlSetUri(appControl, uri); });
+}
+
+extern "C" int app_control_get_uri(app_control_h appControl, char** uri)
+{
+    return platform::GuardedCall(platform::kAppControlLogTag, APP_CONTROL_ERROR_OUT_OF_MEMORY,
+                                 [&] { return AppControlGetUri(appControl, uri); });
+}
+
+extern "C" int app_control_set_app_id(app_control_h appControl, const char* appId)
+{
+    return platform::GuardedCall(platform::kAppControlLogTag, APP_CONTROL_ERROR_OUT_OF_MEMORY,
+                                 [&] { return AppControlSetAppId(appControl, appId); });
+}
+
+extern "C" int app_control_get_app_id(app_control_h appControl, char** appId)
+{
+    return platform::GuardedCall(platform::kAppControlLogTag, APP_CONTROL_ERROR_OUT_OF_MEMORY,
+                                 [&] { return AppControlGetAppId(appControl, appId); });
+}
+
+extern "C" int app_control_add_extra_data(app_control_h appControl, const char* key, const char* value)
+{
+    return platform::GuardedCall(platform::kAppControlLogTag, APP_CONTROL_ERROR_OUT_OF_MEMORY,
+                                 [&] { return AppControlAddExtraData(appControl, key, value); });
+}
+
+extern "C" int app_control_get_extra_data(app_control_h appControl, const char* key, char** value)
+{
+    return platform::GuardedCall(platform::kAppControlLogTag, APP_CONTROL_ERROR_OUT_OF_MEMORY,
+                                 [&] { return AppControlGetExtraData(appControl, key, value); });
+}
+
+extern "C" int app_control_foreach_extra_data(app_control_h appControl, app_control_extra_data_cb callback,
+                                              void* userData)
+{
+    return platform::GuardedCall(platform::kAppControlLogTag, APP_CONTROL_ERROR_OUT_OF_MEMORY,
+                                 [&] { return AppControlForeachExtraData(appControl, callback, userData); });
+}
+
+extern "C" int app_control_get_launch_request(app_control_h* appControl)
+{
+    return platform::GuardedCall(platform::kAppControlLogTag, APP_CONTROL_ERROR_OUT_OF_MEMORY,
+                                 [&] { return AppControlGetLaunchRequest(appControl); });
 }

@@ -12,6 +12,8 @@
 
 #include "app_control/AppControlInternal.h"
 #include "app_control_launch.h"
+#include "core/ApiGuard.h"
+#include "core/JsonText.h"
 #include "core/PlatformRoot.h"
 #include "dlog.h"
 
@@ -75,16 +77,13 @@ bool WaitForExec(pid_t child, int readFd)
 
 void AppendLaunchLog(const platform::AppEntry& entry, const app_control_s& request)
 {
-    std::string line = "{\"time\":" + std::to_string(time(nullptr)) +
-                       ",\"caller\":" + platform::JsonQuote(platform::OwnAppId()) +
-                       ",\"app_id\":" + platform::JsonQuote(entry.appId) +
-                       ",\"operation\":" + platform::JsonQuote(request.operation) +
-                       ",\"uri\":" + platform::JsonQuote(request.uri) +
-                       ",\"extra\":" + platform::BundleToJson(&request.extra) + "}\n";
-    int fd = -1;
-    if (platform::MakeDirs(platform::RootPath("log")))
-        fd = open(platform::RootPath("log/launch.log").c_str(), O_WRONLY | O_CREAT | O_APPEND | O_CLOEXEC,
-                  0644);
+    using platform::JsonString;
+    std::string line =
+        "{\"time\":" + std::to_string(time(nullptr)) + ",\"caller\":" + JsonString(platform::OwnAppId()) +
+        ",\"app_id\":" + JsonString(entry.appId) + ",\"operation\":" + JsonString(request.operation) +
+        ",\"uri\":" + JsonString(request.uri) + ",\"extra\":" + platform::JsonObject(&request.extra) + "}\n";
+    std::string dir = platform::RootPath("log");
+    int fd = platform::MakeDirs(dir) ? platform::OpenPrivateAppend(dir + "/launch.log") : -1;
     // One write, so that lines of several processes never interleave.
     if (fd < 0 || write(fd, line.data(), line.size()) != static_cast<ssize_t>(line.size()))
         dlog_print(DLOG_ERROR, kAppControlLogTag, "cannot write the launch log (errno %d)", errno);
@@ -146,7 +145,10 @@ int SpawnApp(const AppEntry& entry, const std::string& encodedRequest)
 
 }  // namespace platform
 
-extern "C" int app_control_send_launch_request(app_control_h appControl, app_control_reply_cb, void*)
+namespace
+{
+
+int SendLaunchRequest(app_control_h appControl)
 {
     if (!appControl)
         return APP_CONTROL_ERROR_INVALID_PARAMETER;
@@ -168,4 +170,12 @@ extern "C" int app_control_send_launch_request(app_control_h appControl, app_con
     }
     AppendLaunchLog(entry, *appControl);
     return APP_CONTROL_ERROR_NONE;
+}
+
+}  // namespace
+
+extern "C" int app_control_send_launch_request(app_control_h appControl, app_control_reply_cb, void*)
+{
+    return platform::GuardedCall(kAppControlLogTag, APP_CONTROL_ERROR_OUT_OF_MEMORY,
+                                 [&] { return SendLaunchRequest(appControl); });
 }

@@ -2,15 +2,21 @@
 #include "app_control/AppControlInternal.h"
 
 #include <dirent.h>
+#include <sys/stat.h>
 
 #include <algorithm>
 #include <cctype>
+#include <cerrno>
+#include <cstring>
 #include <sstream>
 
 #include "core/PlatformRoot.h"
+#include "dlog.h"
 
 namespace
 {
+
+const size_t kMaxConfBytes = 64 * 1024;
 
 std::string Trim(const std::string& text)
 {
@@ -94,8 +100,23 @@ bool LoadAppEntry(const std::string& appId, AppEntry& entry)
 {
     std::string dir = AppDir(appId);
     std::string content;
-    if (dir.empty() || !ReadFile(dir + "/app.conf", content))
+    if (dir.empty())
         return false;
+    // A linked folder or app.conf could hand our launch to another user's program.
+    struct stat st;
+    if (!IsRealDir(dir))
+    {
+        if (lstat(dir.c_str(), &st) == 0)
+            dlog_print(DLOG_ERROR, kAppControlLogTag, "%s is not a real folder: refused", dir.c_str());
+        return false;
+    }
+    if (!ReadFile(dir + "/app.conf", content, kMaxConfBytes))
+    {
+        if (errno != ENOENT)
+            dlog_print(DLOG_ERROR, kAppControlLogTag, "%s/app.conf refused (%s)", dir.c_str(),
+                       strerror(errno));
+        return false;
+    }
     entry = AppEntry();
     entry.appId = appId;
     std::stringstream stream(content);

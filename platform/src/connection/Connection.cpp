@@ -1,9 +1,10 @@
 #include "net_connection.h"
 
 #include <algorithm>
-#include <new>
+#include <memory>
 #include <vector>
 
+#include "core/ApiGuard.h"
 #include "dlog.h"
 #include "vconf.h"
 
@@ -26,6 +27,10 @@ std::vector<Connection*>& LiveHandles()
 }
 
 bool gWatching = false;
+// The type last reported (or found when the watch began); -1 when unknown.
+// Writers rewrite the status key with the same value: only a new type is
+// news to the callbacks.
+int gLastType = -1;
 
 Connection* FindHandle(connection_h handle)
 {
@@ -38,16 +43,16 @@ connection_type_e TypeOfStatus(int status)
 {
     switch (status)
     {
-    case VCONFKEY_NETWORK_WIFI:
-        return CONNECTION_TYPE_WIFI;
-    case VCONFKEY_NETWORK_CELLULAR:
-        return CONNECTION_TYPE_CELLULAR;
-    case VCONFKEY_NETWORK_ETHERNET:
-        return CONNECTION_TYPE_ETHERNET;
-    case VCONFKEY_NETWORK_BLUETOOTH:
-        return CONNECTION_TYPE_BT;
-    default:
-        return CONNECTION_TYPE_DISCONNECTED;
+        case VCONFKEY_NETWORK_WIFI:
+            return CONNECTION_TYPE_WIFI;
+        case VCONFKEY_NETWORK_CELLULAR:
+            return CONNECTION_TYPE_CELLULAR;
+        case VCONFKEY_NETWORK_ETHERNET:
+            return CONNECTION_TYPE_ETHERNET;
+        case VCONFKEY_NETWORK_BLUETOOTH:
+            return CONNECTION_TYPE_BT;
+        default:
+            return CONNECTION_TYPE_DISCONNECTED;
     }
 }
 
@@ -64,6 +69,9 @@ void NetworkStatusChangedCb(keynode_t* node, void*)
     if (!node)
         return;
     connection_type_e type = TypeOfStatus(vconf_keynode_get_int(node));
+    if (type == gLastType)
+        return;
+    gLastType = type;
     // A callback may destroy handles or unset callbacks: look each up again.
     std::vector<Connection*> snapshot = LiveHandles();
     for (Connection* handle : snapshot)
@@ -78,7 +86,12 @@ void UpdateWatch()
 {
     bool wanted = AnyCallbackSet();
     if (wanted && !gWatching)
-        gWatching = vconf_notify_key_changed(VCONFKEY_NETWORK_STATUS, NetworkStatusChangedCb, nullptr) == VCONF_OK;
+    {
+        int status = 0;
+        gLastType = vconf_get_int(VCONFKEY_NETWORK_STATUS, &status) == VCONF_OK ? TypeOfStatus(status) : -1;
+        gWatching =
+            vconf_notify_key_changed(VCONFKEY_NETWORK_STATUS, NetworkStatusChangedCb, nullptr) == VCONF_OK;
+    }
     else if (!wanted && gWatching)
     {
         vconf_ignore_key_changed(VCONFKEY_NETWORK_STATUS, NetworkStatusChangedCb);
@@ -86,21 +99,17 @@ void UpdateWatch()
     }
 }
 
-}  // namespace
-
-extern "C" int connection_create(connection_h* connection)
+int ConnectionCreate(connection_h* connection)
 {
     if (!connection)
         return CONNECTION_ERROR_INVALID_PARAMETER;
-    auto* handle = new (std::nothrow) Connection();
-    if (!handle)
-        return CONNECTION_ERROR_OUT_OF_MEMORY;
-    LiveHandles().push_back(handle);
-    *connection = handle;
+    auto handle = std::make_unique<Connection>();
+    LiveHandles().push_back(handle.get());
+    *connection = handle.release();
     return CONNECTION_ERROR_NONE;
 }
 
-extern "C" int connection_destroy(connection_h connection)
+int ConnectionDestroy(connection_h connection)
 {
     Connection* handle = FindHandle(connection);
     if (!handle)
@@ -112,7 +121,7 @@ extern "C" int connection_destroy(connection_h connection)
     return CONNECTION_ERROR_NONE;
 }
 
-extern "C" int connection_get_type(connection_h connection, connection_type_e* type)
+int ConnectionGetType(connection_h connection, connection_type_e* type)
 {
     if (!FindHandle(connection) || !type)
         return CONNECTION_ERROR_INVALID_PARAMETER;
@@ -126,8 +135,7 @@ extern "C" int connection_get_type(connection_h connection, connection_type_e* t
     return CONNECTION_ERROR_NONE;
 }
 
-extern "C" int connection_set_type_changed_cb(connection_h connection, connection_type_changed_cb callback,
-                                              void* user_data)
+int ConnectionSetTypeChangedCb(connection_h connection, connection_type_changed_cb callback, void* user_data)
 {
     Connection* handle = FindHandle(connection);
     if (!handle || !callback)
@@ -144,7 +152,7 @@ extern "C" int connection_set_type_changed_cb(connection_h connection, connectio
     return CONNECTION_ERROR_NONE;
 }
 
-extern "C" int connection_unset_type_changed_cb(connection_h connection)
+int ConnectionUnsetTypeChangedCb(connection_h connection)
 {
     Connection* handle = FindHandle(connection);
     if (!handle)
@@ -153,4 +161,37 @@ extern "C" int connection_unset_type_changed_cb(connection_h connection)
     handle->userData = nullptr;
     UpdateWatch();
     return CONNECTION_ERROR_NONE;
+}
+
+}  // namespace
+
+extern "C" int connection_create(connection_h* connection)
+{
+    return platform::GuardedCall(kLogTag, CONNECTION_ERROR_OUT_OF_MEMORY,
+                                 [&] { return ConnectionCreate(connection); });
+}
+
+extern "C" int connection_destroy(connection_h connection)
+{
+    return platform::GuardedCall(kLogTag, CONNECTION_ERROR_OUT_OF_MEMORY,
+                                 [&] { return ConnectionDestroy(connection); });
+}
+
+extern "C" int connection_get_type(connection_h connection, connection_type_e* type)
+{
+    return platform::GuardedCall(kLogTag, CONNECTION_ERROR_OUT_OF_MEMORY,
+                                 [&] { return ConnectionGetType(connection, type); });
+}
+
+extern "C" int connection_set_type_changed_cb(connection_h connection, connection_type_changed_cb callback,
+                                              void* user_data)
+{
+    return platform::GuardedCall(kLogTag, CONNECTION_ERROR_OUT_OF_MEMORY,
+                                 [&] { return ConnectionSetTypeChangedCb(connection, callback, user_data); });
+}
+
+extern "C" int connection_unset_type_changed_cb(connection_h connection)
+{
+    return platform::GuardedCall(kLogTag, CONNECTION_ERROR_OUT_OF_MEMORY,
+                                 [&] { return ConnectionUnsetTypeChangedCb(connection); });
 }

@@ -1,9 +1,10 @@
 #include "locations.h"
 
 #include <algorithm>
-#include <new>
+#include <memory>
 #include <vector>
 
+#include "core/ApiGuard.h"
 #include "dlog.h"
 #include "vconf.h"
 
@@ -27,20 +28,18 @@ const char* SettingKey(location_method_e method)
 {
     switch (method)
     {
-    case LOCATIONS_METHOD_HYBRID:
-        return VCONFKEY_LOCATION_USE_MY_LOCATION;
-    case LOCATIONS_METHOD_GPS:
-        return VCONFKEY_LOCATION_ENABLED;
-    case LOCATIONS_METHOD_WPS:
-        return VCONFKEY_LOCATION_NETWORK_ENABLED;
-    default:
-        return nullptr;
+        case LOCATIONS_METHOD_HYBRID:
+            return VCONFKEY_LOCATION_USE_MY_LOCATION;
+        case LOCATIONS_METHOD_GPS:
+            return VCONFKEY_LOCATION_ENABLED;
+        case LOCATIONS_METHOD_WPS:
+            return VCONFKEY_LOCATION_NETWORK_ENABLED;
+        default:
+            return nullptr;
     }
 }
 
-}  // namespace
-
-extern "C" int location_manager_is_enabled_method(location_method_e method, bool* enable)
+int LocationManagerIsEnabledMethod(location_method_e method, bool* enable)
 {
     const char* key = SettingKey(method);
     if (!key)
@@ -57,21 +56,19 @@ extern "C" int location_manager_is_enabled_method(location_method_e method, bool
     return LOCATIONS_ERROR_NONE;
 }
 
-extern "C" int location_manager_create(location_method_e method, location_manager_h* manager)
+int LocationManagerCreate(location_method_e method, location_manager_h* manager)
 {
     if (!SettingKey(method))
         return LOCATIONS_ERROR_INCORRECT_METHOD;
     if (!manager)
         return LOCATIONS_ERROR_INVALID_PARAMETER;
-    auto* made = new (std::nothrow) location_manager_s{method};
-    if (!made)
-        return LOCATIONS_ERROR_OUT_OF_MEMORY;
-    LiveManagers().push_back(made);
-    *manager = made;
+    auto made = std::make_unique<location_manager_s>(location_manager_s{method});
+    LiveManagers().push_back(made.get());
+    *manager = made.release();
     return LOCATIONS_ERROR_NONE;
 }
 
-extern "C" int location_manager_destroy(location_manager_h manager)
+int LocationManagerDestroy(location_manager_h manager)
 {
     auto& managers = LiveManagers();
     auto it = std::find(managers.begin(), managers.end(), manager);
@@ -80,4 +77,24 @@ extern "C" int location_manager_destroy(location_manager_h manager)
     managers.erase(it);
     delete manager;
     return LOCATIONS_ERROR_NONE;
+}
+
+}  // namespace
+
+extern "C" int location_manager_is_enabled_method(location_method_e method, bool* enable)
+{
+    return platform::GuardedCall(kLogTag, LOCATIONS_ERROR_OUT_OF_MEMORY,
+                                 [&] { return LocationManagerIsEnabledMethod(method, enable); });
+}
+
+extern "C" int location_manager_create(location_method_e method, location_manager_h* manager)
+{
+    return platform::GuardedCall(kLogTag, LOCATIONS_ERROR_OUT_OF_MEMORY,
+                                 [&] { return LocationManagerCreate(method, manager); });
+}
+
+extern "C" int location_manager_destroy(location_manager_h manager)
+{
+    return platform::GuardedCall(kLogTag, LOCATIONS_ERROR_OUT_OF_MEMORY,
+                                 [&] { return LocationManagerDestroy(manager); });
 }

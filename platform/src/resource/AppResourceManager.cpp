@@ -11,6 +11,7 @@
 #include <string>
 
 #include "app_common.h"
+#include "core/ApiGuard.h"
 #include "core/PlatformRoot.h"
 #include "dlog.h"
 
@@ -52,7 +53,7 @@ std::string OwnResourceDir()
     return dir;
 }
 
-std::string StripTypePrefix(app_resource_e type, const std::string& id)
+std::string StripTypePrefix(int type, const std::string& id)
 {
     std::string prefix = kTypePrefixes[type];
     if (id.compare(0, prefix.size(), prefix) == 0)
@@ -60,15 +61,7 @@ std::string StripTypePrefix(app_resource_e type, const std::string& id)
     return id;
 }
 
-}  // namespace
-
-extern "C" int app_resource_manager_init(void)
-{
-    gInitialised = true;
-    return APP_RESOURCE_ERROR_NONE;
-}
-
-extern "C" int app_resource_manager_get(app_resource_e type, const char* id, char** path)
+int AppResourceManagerGet(int type, const char* id, char** path)
 {
     if (type < APP_RESOURCE_TYPE_MIN || type > APP_RESOURCE_TYPE_MAX || !id || !path)
         return APP_RESOURCE_ERROR_INVALID_PARAMETER;
@@ -96,6 +89,22 @@ extern "C" int app_resource_manager_get(app_resource_e type, const char* id, cha
     }
     dlog_print(DLOG_ERROR, kLogTag, "no file for resource \"%s\" in %s", id, resDir.c_str());
     return APP_RESOURCE_ERROR_IO_ERROR;
+}
+
+}  // namespace
+
+extern "C" int app_resource_manager_init(void)
+{
+    gInitialised = true;
+    return APP_RESOURCE_ERROR_NONE;
+}
+
+extern "C" int app_resource_manager_get(app_resource_e type, const char* id, char** path)
+{
+    // Read once as a number: callers may pass values outside the enum.
+    int rawType = type;
+    return platform::GuardedCall(kLogTag, APP_RESOURCE_ERROR_OUT_OF_MEMORY,
+                                 [&] { return AppResourceManagerGet(rawType, id, path); });
 }
 
 extern "C" int app_resource_manager_release(void)

@@ -1,28 +1,20 @@
 // The uxt_theme_* functions over the process's ThemeState.
 #include "uxt_theme.h"
 
+#include "core/ApiGuard.h"
 #include "theme/ThemeState.h"
-
-#include <new>
 
 using platform::theme::ThemeState;
 
 namespace
 {
-// No C++ exception may cross into C callers; memory is the only thing
-// that can run out here.
+const char* const kLogTag = "platform-theme";
+
+// No C++ exception may cross into C callers.
 template <typename Result, typename Call>
 Result Guarded(Result onFailure, Call call)
 {
-    try
-    {
-        return call();
-    }
-    catch (const std::bad_alloc&)
-    {
-        set_last_result(UXT_THEME_ERROR_OUT_OF_MEMORY);
-        return onFailure;
-    }
+    return platform::GuardedCall(kLogTag, onFailure, call);
 }
 }  // namespace
 
@@ -34,7 +26,7 @@ extern "C" int uxt_theme_set_changeable_ui_enabled(bool enabled)
 
 extern "C" bool uxt_theme_get_changeable_ui_enabled(void)
 {
-    return ThemeState::GetInstance().GetIsEnabled();
+    return Guarded<bool>(false, [] { return ThemeState::GetInstance().GetIsEnabled(); });
 }
 
 extern "C" uxt_theme_color_table_h uxt_theme_add_color_table(const char* file_path)
@@ -45,7 +37,8 @@ extern "C" uxt_theme_color_table_h uxt_theme_add_color_table(const char* file_pa
 
 extern "C" int uxt_theme_delete_color_table(uxt_theme_color_table_h table)
 {
-    return ThemeState::GetInstance().DeleteColorTable(table);
+    return Guarded<int>(UXT_THEME_ERROR_OUT_OF_MEMORY,
+                        [&] { return ThemeState::GetInstance().DeleteColorTable(table); });
 }
 
 extern "C" int uxt_theme_set_color_table(uxt_theme_color_table_h table)
@@ -62,7 +55,8 @@ extern "C" uxt_theme_font_table_h uxt_theme_add_font_table(const char* file_path
 
 extern "C" int uxt_theme_delete_font_table(uxt_theme_font_table_h table)
 {
-    return ThemeState::GetInstance().DeleteFontTable(table);
+    return Guarded<int>(UXT_THEME_ERROR_OUT_OF_MEMORY,
+                        [&] { return ThemeState::GetInstance().DeleteFontTable(table); });
 }
 
 extern "C" int uxt_theme_set_font_table(uxt_theme_font_table_h table)
@@ -81,7 +75,8 @@ extern "C" int uxt_theme_get_style(uxt_theme_style_e* style)
 {
     if (!style)
         return UXT_THEME_ERROR_INVALID_PARAMETER;
-    *style = ThemeState::GetInstance().GetStyle();
+    *style = Guarded<uxt_theme_style_e>(UXT_THEME_STYLE_DEFAULT,
+                                        [] { return ThemeState::GetInstance().GetStyle(); });
     return UXT_THEME_ERROR_NONE;
 }
 

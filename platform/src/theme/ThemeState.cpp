@@ -4,6 +4,7 @@
 #include <Elementary.h>
 
 #include <algorithm>
+#include <cerrno>
 #include <cstring>
 #include <memory>
 
@@ -26,17 +27,16 @@ int ReadTable(const char* path, std::string& xml)
 {
     if (!path || !*path)
         return UXT_THEME_ERROR_INVALID_PARAMETER;
-    if (!ReadFile(path, xml))
+    // Tables may be installed as links; FIFOs and devices are refused.
+    if (ReadFile(path, xml, MAX_TABLE_BYTES, true))
+        return UXT_THEME_ERROR_NONE;
+    if (errno == EFBIG)
     {
-        dlog_print(DLOG_ERROR, LOG_TAG, "cannot read theme table %s", path);
-        return UXT_THEME_ERROR_IO_ERROR;
-    }
-    if (xml.size() > MAX_TABLE_BYTES)
-    {
-        dlog_print(DLOG_ERROR, LOG_TAG, "theme table %s is too large (%zu bytes)", path, xml.size());
+        dlog_print(DLOG_ERROR, LOG_TAG, "theme table %s is larger than %zu bytes", path, MAX_TABLE_BYTES);
         return UXT_THEME_ERROR_NO_DATA;
     }
-    return UXT_THEME_ERROR_NONE;
+    dlog_print(DLOG_ERROR, LOG_TAG, "cannot read theme table %s (%s)", path, strerror(errno));
+    return UXT_THEME_ERROR_IO_ERROR;
 }
 
 void SetColorClass(const std::string& name, const Rgba& c, const Rgba& o, const Rgba& s)

@@ -9,10 +9,13 @@
 #include <atomic>
 #include <cerrno>
 #include <list>
+#include <memory>
 #include <new>
 #include <string>
 
 #include "bundle/BundleInternal.h"
+#include "core/ApiGuard.h"
+#include "core/JsonText.h"
 #include "core/PlatformRoot.h"
 #include "dlog.h"
 
@@ -34,10 +37,8 @@ struct Completion
 
 bool AppendRecord(const std::string& line)
 {
-    int fd = -1;
-    if (platform::MakeDirs(platform::RootPath("log")))
-        fd = open(platform::RootPath("log/usage.log").c_str(), O_WRONLY | O_CREAT | O_APPEND | O_CLOEXEC,
-                  0644);
+    std::string dir = platform::RootPath("log");
+    int fd = platform::MakeDirs(dir) ? platform::OpenPrivateAppend(dir + "/usage.log") : -1;
     bool ok = fd >= 0 && write(fd, line.data(), line.size()) == static_cast<ssize_t>(line.size());
     int error = errno;
     if (fd >= 0)
@@ -77,20 +78,20 @@ void CompletionCb(void* data)
 void ScheduleCompletion(quorvex_log_manager_h manager, int requestId, const char* uri,
                         quorvex_log_manager_insert_cb callback, void* userData)
 {
-    auto* completion = new Completion{manager, nullptr, requestId, uri, callback, userData};
-    completion->job = ecore_job_add(CompletionCb, completion);
+    auto completion =
+        std::make_unique<Completion>(Completion{manager, nullptr, requestId, uri, callback, userData});
+    manager->pending.push_back(completion.get());
+    completion->job = ecore_job_add(CompletionCb, completion.get());
     if (!completion->job)
     {
         dlog_print(DLOG_ERROR, kLogTag, "cannot report the completion of request %d", requestId);
-        delete completion;
+        manager->pending.pop_back();
         return;
     }
-    manager->pending.push_back(completion);
+    completion.release();
 }
 
-}  // namespace
-
-extern "C" int quorvex_log_manager_create(quorvex_log_manager_h* manager)
+int QuorvexLogManagerCreate(quorvex_log_manager_h* manager)
 {
     if (!manager)
         return QUORVEX_LOG_MANAGER_ERROR_INVALID_PARAMETER;
@@ -101,7 +102,7 @@ extern "C" int quorvex_log_manager_create(quorvex_log_manager_h* manager)
     return QUORVEX_LOG_MANAGER_ERROR_NONE;
 }
 
-extern "C" int quorvex_log_manager_destroy(quorvex_log_manager_h manager)
+int QuorvexLogManagerDestroy(quorvex_log_manager_h manager)
 {
     if (!manager)
         return QUORVEX_LOG_MANAGER_ERROR_INVALID_PARAMETER;
@@ -115,8 +116,8 @@ extern "C" int quorvex_log_manager_destroy(quorvex_log_manager_h manager)
     return QUORVEX_LOG_MANAGER_ERROR_NONE;
 }
 
-extern "C" int quorvex_log_manager_insert(quorvex_log_manager_h manager, const char* uri, bundle* data,
-                                          quorvex_log_manager_insert_cb callback, void* userData)
+int QuorvexLogManagerInsert(quorvex_log_manager_h manager, const char* uri, bundle* data,
+                            quorvex_log_manager_insert_cb callback, void* userData)
 {
     if (!manager || !uri || !*uri || !data || data->items.empty())
     {
@@ -125,11 +126,33 @@ extern "C" int quorvex_log_manager_insert(quorvex_log_manager_h manager, const c
     }
     int requestId = gNextRequestId++;
     std::string line = "{\"request_id\":" + std::to_string(requestId) +
-                       ",\"uri\":" + platform::JsonQuote(uri) + ",\"data\":" + platform::BundleToJson(data) +
+                       ",\"uri\":" + platform::JsonString(uri) + ",\"data\":" + platform::JsonObject(data) +
                        "}\n";
     if (!AppendRecord(line))
         return QUORVEX_LOG_MANAGER_ERROR_IO_ERROR;
     if (callback)
         ScheduleCompletion(manager, requestId, uri, callback, userData);
     return requestId;
+}
+
+}  // namespace
+
+extern "C" int quorvex_log_manager_create(quorvex_log_manager_h* manager)
+{
+    return platform::GuardedCall(kLogTag, QUORVEX_LOG_MANAGER_ERROR_OUT_OF_MEMORY,
+                                 [&] { return QuorvexLogManagerCreate(manager); });
+}
+
+extern "C" int quorvex_log_manager_destroy(quorvex_log_manager_h manager)
+{
+    return platform::GuardedCall(kLogTag, QUORVEX_LOG_MANAGER_ERROR_OUT_OF_MEMORY,
+                                 [&] { return QuorvexLogManagerDestroy(manager); });
+}
+
+extern "C" int quorvex_log_manager_insert(quorvex_log_manager_h manager, const char* uri, bundle* data,
+                                          quorvex_log_manager_insert_cb callback, void* userData)
+{
+    return platform::GuardedCall(kLogTag, QUORVEX_LOG_MANAGER_ERROR_OUT_OF_MEMORY,
+                                 [&]
+                                 { return QuorvexLogManagerInsert(manager, uri, data, callback, userData); });
 }

@@ -2,11 +2,13 @@
 
 #include <cstring>
 
+#include "core/ApiGuard.h"
 #include "core/PlatformRoot.h"
 #include "dlog.h"
 #include "vconf/VconfStore.h"
 #include "vconf/VconfWatch.h"
 
+using platform::GuardedCall;
 using platform::vconf::kLogTag;
 using platform::vconf::Value;
 
@@ -43,9 +45,7 @@ bool NodeHasType(const keynode_t* node, int type)
     return true;
 }
 
-}  // namespace
-
-extern "C" int vconf_get_int(const char* key, int* intval)
+int GetInt(const char* key, int* intval)
 {
     Value value;
     if (!intval || !ReadTyped(key, VCONF_TYPE_INT, value))
@@ -54,7 +54,7 @@ extern "C" int vconf_get_int(const char* key, int* intval)
     return VCONF_OK;
 }
 
-extern "C" int vconf_get_bool(const char* key, int* boolval)
+int GetBool(const char* key, int* boolval)
 {
     Value value;
     if (!boolval || !ReadTyped(key, VCONF_TYPE_BOOL, value))
@@ -63,7 +63,7 @@ extern "C" int vconf_get_bool(const char* key, int* boolval)
     return VCONF_OK;
 }
 
-extern "C" int vconf_get_dbl(const char* key, double* dblval)
+int GetDbl(const char* key, double* dblval)
 {
     Value value;
     if (!dblval || !ReadTyped(key, VCONF_TYPE_DOUBLE, value))
@@ -72,7 +72,7 @@ extern "C" int vconf_get_dbl(const char* key, double* dblval)
     return VCONF_OK;
 }
 
-extern "C" char* vconf_get_str(const char* key)
+char* GetStr(const char* key)
 {
     Value value;
     if (!ReadTyped(key, VCONF_TYPE_STRING, value))
@@ -80,7 +80,7 @@ extern "C" char* vconf_get_str(const char* key)
     return platform::CopyString(value.strValue);
 }
 
-extern "C" int vconf_set_int(const char* key, const int intval)
+int SetInt(const char* key, const int intval)
 {
     Value value;
     value.type = VCONF_TYPE_INT;
@@ -88,7 +88,7 @@ extern "C" int vconf_set_int(const char* key, const int intval)
     return WriteTyped(key, value);
 }
 
-extern "C" int vconf_set_bool(const char* key, const int boolval)
+int SetBool(const char* key, const int boolval)
 {
     Value value;
     value.type = VCONF_TYPE_BOOL;
@@ -96,7 +96,7 @@ extern "C" int vconf_set_bool(const char* key, const int boolval)
     return WriteTyped(key, value);
 }
 
-extern "C" int vconf_set_dbl(const char* key, const double dblval)
+int SetDbl(const char* key, const double dblval)
 {
     Value value;
     value.type = VCONF_TYPE_DOUBLE;
@@ -104,7 +104,7 @@ extern "C" int vconf_set_dbl(const char* key, const double dblval)
     return WriteTyped(key, value);
 }
 
-extern "C" int vconf_set_str(const char* key, const char* strval)
+int SetStr(const char* key, const char* strval)
 {
     if (!strval)
     {
@@ -117,14 +117,60 @@ extern "C" int vconf_set_str(const char* key, const char* strval)
     return WriteTyped(key, value);
 }
 
+}  // namespace
+
+// Every entry point below is guarded: no exception may reach a C caller.
+
+extern "C" int vconf_get_int(const char* key, int* intval)
+{
+    return GuardedCall(kLogTag, VCONF_ERROR, [&] { return GetInt(key, intval); });
+}
+
+extern "C" int vconf_get_bool(const char* key, int* boolval)
+{
+    return GuardedCall(kLogTag, VCONF_ERROR, [&] { return GetBool(key, boolval); });
+}
+
+extern "C" int vconf_get_dbl(const char* key, double* dblval)
+{
+    return GuardedCall(kLogTag, VCONF_ERROR, [&] { return GetDbl(key, dblval); });
+}
+
+extern "C" char* vconf_get_str(const char* key)
+{
+    return GuardedCall(kLogTag, nullptr, [&] { return GetStr(key); });
+}
+
+extern "C" int vconf_set_int(const char* key, const int intval)
+{
+    return GuardedCall(kLogTag, VCONF_ERROR, [&] { return SetInt(key, intval); });
+}
+
+extern "C" int vconf_set_bool(const char* key, const int boolval)
+{
+    return GuardedCall(kLogTag, VCONF_ERROR, [&] { return SetBool(key, boolval); });
+}
+
+extern "C" int vconf_set_dbl(const char* key, const double dblval)
+{
+    return GuardedCall(kLogTag, VCONF_ERROR, [&] { return SetDbl(key, dblval); });
+}
+
+extern "C" int vconf_set_str(const char* key, const char* strval)
+{
+    return GuardedCall(kLogTag, VCONF_ERROR, [&] { return SetStr(key, strval); });
+}
+
 extern "C" int vconf_notify_key_changed(const char* key, vconf_callback_fn cb, void* user_data)
 {
-    return platform::vconf::WatchRegistry::GetInstance().Add(key, cb, user_data);
+    return GuardedCall(kLogTag, VCONF_ERROR,
+                       [&] { return platform::vconf::WatchRegistry::GetInstance().Add(key, cb, user_data); });
 }
 
 extern "C" int vconf_ignore_key_changed(const char* key, vconf_callback_fn cb)
 {
-    return platform::vconf::WatchRegistry::GetInstance().Remove(key, cb);
+    return GuardedCall(kLogTag, VCONF_ERROR,
+                       [&] { return platform::vconf::WatchRegistry::GetInstance().Remove(key, cb); });
 }
 
 extern "C" char* vconf_keynode_get_name(keynode_t* keynode)

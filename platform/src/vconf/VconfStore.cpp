@@ -4,6 +4,7 @@
 #include <climits>
 #include <cmath>
 #include <cstdlib>
+#include <cstring>
 #include <locale>
 #include <sstream>
 
@@ -75,16 +76,16 @@ const char* TypeWord(int type)
 {
     switch (type)
     {
-    case VCONF_TYPE_INT:
-        return "int";
-    case VCONF_TYPE_BOOL:
-        return "bool";
-    case VCONF_TYPE_DOUBLE:
-        return "double";
-    case VCONF_TYPE_STRING:
-        return "string";
-    default:
-        return nullptr;
+        case VCONF_TYPE_INT:
+            return "int";
+        case VCONF_TYPE_BOOL:
+            return "bool";
+        case VCONF_TYPE_DOUBLE:
+            return "double";
+        case VCONF_TYPE_STRING:
+            return "string";
+        default:
+            return nullptr;
     }
 }
 
@@ -149,41 +150,55 @@ bool Decode(const std::string& content, Value& value)
     bool ok = false;
     switch (type)
     {
-    case VCONF_TYPE_INT:
-        ok = ParseInt(body, parsed.intValue);
-        break;
-    case VCONF_TYPE_BOOL:
-        ok = ParseInt(body, parsed.intValue) && (parsed.intValue == 0 || parsed.intValue == 1);
-        break;
-    case VCONF_TYPE_DOUBLE:
-        ok = ParseDouble(body, parsed.dblValue);
-        break;
-    case VCONF_TYPE_STRING:
-        if (!body.empty() && body.back() == '\n')
-            body.pop_back();
-        ok = body.find('\0') == std::string::npos;
-        parsed.strValue = body;
-        break;
-    default:
-        break;
+        case VCONF_TYPE_INT:
+            ok = ParseInt(body, parsed.intValue);
+            break;
+        case VCONF_TYPE_BOOL:
+            ok = ParseInt(body, parsed.intValue) && (parsed.intValue == 0 || parsed.intValue == 1);
+            break;
+        case VCONF_TYPE_DOUBLE:
+            ok = ParseDouble(body, parsed.dblValue);
+            break;
+        case VCONF_TYPE_STRING:
+            if (!body.empty() && body.back() == '\n')
+                body.pop_back();
+            ok = body.find('\0') == std::string::npos;
+            parsed.strValue = body;
+            break;
+        default:
+            break;
     }
     if (ok)
         value = parsed;
     return ok;
 }
 
-bool Read(const char* key, Value& value)
+namespace
 {
-    std::string path = KeyPath(key ? key : "");
-    if (path.empty())
+// The key's file, or empty with a log line saying why there is none.
+std::string CheckedKeyPath(const char* key)
+{
+    if (!IsValidKey(key))
     {
         dlog_print(DLOG_ERROR, kLogTag, "invalid key name \"%s\"", key ? key : "(null)");
-        return false;
+        return std::string();
     }
+    std::string path = KeyPath(key);
+    if (path.empty())
+        dlog_print(DLOG_ERROR, kLogTag, "key %s: the platform root is refused", key);
+    return path;
+}
+}  // namespace
+
+bool Read(const char* key, Value& value)
+{
+    std::string path = CheckedKeyPath(key);
+    if (path.empty())
+        return false;
     std::string content;
-    if (!ReadFile(path, content))
+    if (!ReadFile(path, content, kMaxContent))
     {
-        dlog_print(DLOG_ERROR, kLogTag, "key %s cannot be read (errno %d)", key, errno);
+        dlog_print(DLOG_ERROR, kLogTag, "key %s cannot be read (%s)", key, strerror(errno));
         return false;
     }
     if (!Decode(content, value))
@@ -196,17 +211,22 @@ bool Read(const char* key, Value& value)
 
 bool Write(const char* key, const Value& value)
 {
-    std::string path = KeyPath(key ? key : "");
+    std::string path = CheckedKeyPath(key);
     if (path.empty())
+        return false;
+    std::string content = Encode(value);
+    Value check;
+    // Nothing is stored that readers would refuse.
+    if (content.empty() || !Decode(content, check))
     {
-        dlog_print(DLOG_ERROR, kLogTag, "invalid key name \"%s\"", key ? key : "(null)");
+        dlog_print(DLOG_ERROR, kLogTag,
+                   "key %s: the value would not read back (over %zu bytes or not finite)", key, kMaxContent);
         return false;
     }
-    std::string content = Encode(value);
     std::string dir = path.substr(0, path.rfind('/'));
-    if (content.empty() || !MakeDirs(dir) || !WriteFileAtomic(path, content))
+    if (!MakeDirs(dir) || !WriteFileAtomic(path, content))
     {
-        dlog_print(DLOG_ERROR, kLogTag, "key %s cannot be written (errno %d)", key, errno);
+        dlog_print(DLOG_ERROR, kLogTag, "key %s cannot be written (%s)", key, strerror(errno));
         return false;
     }
     return true;

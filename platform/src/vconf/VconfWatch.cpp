@@ -2,7 +2,9 @@
 
 #include <cerrno>
 #include <climits>
+#include <cstring>
 #include <sys/inotify.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include "core/PlatformRoot.h"
@@ -16,7 +18,16 @@ namespace vconf
 namespace
 {
 // A finished write: our atomic rename, or a person writing the file in place.
-const uint32_t kWatchMask = IN_MOVED_TO | IN_CLOSE_WRITE;
+const uint32_t kWriteDone = IN_MOVED_TO | IN_CLOSE_WRITE;
+// The folder going away, or a missing folder below it coming back.
+const uint32_t kFolderChange = IN_CREATE | IN_DELETE_SELF | IN_MOVE_SELF;
+const uint32_t kWatchMask = kWriteDone | kFolderChange | IN_ONLYDIR;
+
+bool Exists(const std::string& path)
+{
+    struct stat st;
+    return lstat(path.c_str(), &st) == 0;
+}
 }  // namespace
 
 WatchRegistry& WatchRegistry::GetInstance()
@@ -78,7 +89,8 @@ int WatchRegistry::Add(const char* key, vconf_callback_fn cb, void* userData)
         dlog_print(DLOG_ERROR, kLogTag, "cannot watch %s (errno %d)", dir.c_str(), errno);
         return VCONF_ERROR;
     }
-    mRegistrations.push_back({mNextId++, key, path.substr(slash + 1), wd, cb, userData});
+    mRegistrations.push_back(
+        {mNextId++, key, RootDir(), dir, path.substr(slash + 1), wd, true, cb, userData});
     return VCONF_OK;
 }
 
@@ -92,13 +104,18 @@ int WatchRegistry::Remove(const char* key, vconf_callback_fn cb)
             continue;
         int wd = it->wd;
         mRegistrations.erase(it);
-        if (wd >= 0 && !IsWdInUse(wd))
-            inotify_rm_watch(mFd, wd);
+        DropWdIfUnused(wd);
         return VCONF_OK;
     }
     dlog_print(DLOG_ERROR, kLogTag, "no such callback registered for %s", key);
     errno = ENOENT;
     return VCONF_ERROR;
+}
+
+void WatchRegistry::DropWdIfUnused(int wd)
+{
+    if (wd >= 0 && !IsWdInUse(wd))
+        inotify_rm_watch(mFd, wd);
 }
 
 bool WatchRegistry::IsWdInUse(int wd) const
@@ -137,8 +154,7 @@ void WatchRegistry::OnReadable()
     std::vector<Pending> pending;
     CollectEvents(pending);
     // Callbacks may add or remove registrations; each is looked up afresh.
-    for (const Pending& item : pending)
-        Dispatch(item);
+    for (const Pending& item : pending) Dispatch(item);
 }
 
 void WatchRegistry::CollectEvents(std::vector<Pending>& pending)
@@ -153,20 +169,60 @@ void WatchRegistry::CollectEvents(std::vector<Pending>& pending)
         {
             const auto* event = reinterpret_cast<const struct inotify_event*>(buffer + offset);
             offset += static_cast<ssize_t>(sizeof(struct inotify_event) + event->len);
-            if (event->mask & IN_IGNORED)
-            {
-                for (Registration& reg : mRegistrations)
-                    if (reg.wd == event->wd)
-                        reg.wd = -1;
-                continue;
-            }
-            if (event->len == 0)
-                continue;
-            for (const Registration& reg : mRegistrations)
-                if (reg.wd == event->wd && reg.fileName == event->name)
-                    pending.push_back({reg.id, reg.key});
+            OnEvent(*event, pending);
         }
     }
+}
+
+void WatchRegistry::OnEvent(const struct inotify_event& event, std::vector<Pending>& pending)
+{
+    if (event.mask & IN_Q_OVERFLOW)
+    {
+        // Changes were lost: every key may have changed.
+        for (const Registration& reg : mRegistrations)
+            if (reg.atDir)
+                pending.push_back({reg.id, reg.key});
+        return;
+    }
+    bool folderLost = (event.mask & (IN_IGNORED | IN_DELETE_SELF | IN_MOVE_SELF)) != 0;
+    for (Registration& reg : mRegistrations)
+    {
+        if (reg.wd != event.wd)
+            continue;
+        if (folderLost || (!reg.atDir && (event.mask & (IN_CREATE | IN_MOVED_TO))))
+            Rearm(reg, pending);
+        else if (reg.atDir && (event.mask & kWriteDone) && event.len > 0 && reg.fileName == event.name)
+            pending.push_back({reg.id, reg.key});
+    }
+}
+
+void WatchRegistry::Rearm(Registration& reg, std::vector<Pending>& pending)
+{
+    int oldWd = reg.wd;
+    reg.wd = -1;
+    reg.atDir = false;
+    // A folder made between two tries is found by the next one.
+    for (int attempt = 0; attempt < 8; ++attempt)
+    {
+        std::string path = reg.dir;
+        int wd;
+        while ((wd = inotify_add_watch(mFd, path.c_str(), kWatchMask)) < 0 &&
+               (errno == ENOENT || errno == ENOTDIR) && path.size() > reg.root.size())
+            path = path.substr(0, path.rfind('/'));
+        reg.wd = wd;
+        reg.atDir = wd >= 0 && path == reg.dir;
+        if (wd < 0 || reg.atDir || !Exists(reg.dir.substr(0, reg.dir.find('/', path.size() + 1))))
+            break;
+    }
+    int error = errno;
+    if (reg.wd != oldWd)
+        DropWdIfUnused(oldWd);
+    if (reg.wd < 0)
+        dlog_print(DLOG_ERROR, kLogTag, "key %s is no longer watched: %s is gone (%s)", reg.key.c_str(),
+                   reg.root.c_str(), strerror(error));
+    // The key may have been written before its folder was watched again.
+    else if (reg.atDir && Exists(reg.dir + "/" + reg.fileName))
+        pending.push_back({reg.id, reg.key});
 }
 
 void WatchRegistry::Dispatch(const Pending& pending)

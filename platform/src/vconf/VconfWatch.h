@@ -3,6 +3,8 @@
 
 #include <Ecore.h>
 
+#include <sys/inotify.h>
+
 #include <cstdint>
 #include <string>
 #include <vector>
@@ -23,6 +25,9 @@ namespace vconf
 
 // The key watches of this process: one inotify descriptor watching the
 // folders of the watched keys, read on the Ecore main loop. Main loop only.
+// When a key's folder is removed, its nearest remaining folder inside the
+// root is watched until the key's folder is back; a key whose root is gone
+// is reported as no longer watched.
 class WatchRegistry
 {
 public:
@@ -38,8 +43,11 @@ private:
     {
         uint64_t id;
         std::string key;
+        std::string root;
+        std::string dir;  // the key's folder
         std::string fileName;
         int wd;
+        bool atDir;  // wd watches `dir`, not one of its parents
         vconf_callback_fn cb;
         void* userData;
     };
@@ -54,6 +62,10 @@ private:
     static Eina_Bool FdReadableCb(void* data, Ecore_Fd_Handler* handler);
     void OnReadable();
     void CollectEvents(std::vector<Pending>& pending);
+    void OnEvent(const struct inotify_event& event, std::vector<Pending>& pending);
+    // Watches the key's folder again, or its nearest existing parent.
+    void Rearm(Registration& reg, std::vector<Pending>& pending);
+    void DropWdIfUnused(int wd);
     void Dispatch(const Pending& pending);
     const Registration* Find(uint64_t id) const;
     bool IsWdInUse(int wd) const;

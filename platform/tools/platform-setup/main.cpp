@@ -31,23 +31,33 @@ struct Options
 
 void Usage(FILE* out)
 {
-    fprintf(out,
-            "usage: platform-setup [--help] [--root DIR] [--app PROGRAM] [--agent PROGRAM] [--widget PROGRAM]\n"
-            "                      [--res BUILD_RES_DIR] [--browser PROGRAM] [--reset]\n"
-            "Keys that exist are kept unless --reset is given.\n");
+    fprintf(
+        out,
+        "usage: platform-setup [--help] [--root DIR] [--app PROGRAM] [--agent PROGRAM] [--widget PROGRAM]\n"
+        "                      [--res BUILD_RES_DIR] [--browser PROGRAM] [--reset]\n"
+        "Keys that exist are kept unless --reset is given.\n");
 }
 
 bool ParseOptions(int argc, char** argv, Options& options)
 {
-    static const option kOptions[] = {
-        {"root", required_argument, nullptr, 'r'},  {"app", required_argument, nullptr, 'a'},
-        {"agent", required_argument, nullptr, 'g'}, {"widget", required_argument, nullptr, 'w'},
-        {"res", required_argument, nullptr, 's'},   {"browser", required_argument, nullptr, 'b'},
-        {"reset", no_argument, nullptr, 'x'},       {"help", no_argument, nullptr, 'h'},
-        {nullptr, 0, nullptr, 0}};
+    static const option kOptions[] = {{"root", required_argument, nullptr, 'r'},
+                                      {"app", required_argument, nullptr, 'a'},
+                                      {"agent", required_argument, nullptr, 'g'},
+                                      {"widget", required_argument, nullptr, 'w'},
+                                      {"res", required_argument, nullptr, 's'},
+                                      {"browser", required_argument, nullptr, 'b'},
+                                      {"reset", no_argument, nullptr, 'x'},
+                                      {"help", no_argument, nullptr, 'h'},
+                                      {nullptr, 0, nullptr, 0}};
     int c;
     while ((c = getopt_long(argc, argv, "h", kOptions, nullptr)) != -1)
     {
+        // A line break would add lines of its own to an app.conf.
+        if (optarg && strpbrk(optarg, "\r\n"))
+        {
+            fprintf(stderr, "platform-setup: option values must not contain line breaks\n");
+            return false;
+        }
         switch (c)
         {
             case 'r':
@@ -170,8 +180,27 @@ bool LinkResources(const std::string& appId, const std::string& resDir, const ch
 bool RegisterApp(const std::string& appId, const std::string& conf)
 {
     std::string dir = platform::AppDir(appId);
+    struct stat st;
+    if (dir.empty() || (lstat(dir.c_str(), &st) == 0 && !platform::IsRealDir(dir)))
+    {
+        fprintf(stderr, "platform-setup: %s is not a real folder; %s is not registered\n", dir.c_str(),
+                appId.c_str());
+        return false;
+    }
     return platform::MakeDirs(dir + "/shared/data") &&
            (conf.empty() || platform::WriteFileAtomic(dir + "/app.conf", conf));
+}
+
+// "exec=<absolute program>\n"; empty when the path would break the line.
+std::string ExecLine(const std::string& program)
+{
+    std::string path = Absolute(program);
+    if (path.find_first_of("\r\n") != std::string::npos)
+    {
+        fprintf(stderr, "platform-setup: %s contains a line break\n", path.c_str());
+        return std::string();
+    }
+    return "exec=" + path + "\n";
 }
 
 bool RegisterSuite(const Options& options)
@@ -181,15 +210,19 @@ bool RegisterSuite(const Options& options)
          {"com.quorvex.weather-m", "com.quorvex.weather-m-agent", "com.quorvex.weather-m-widget"})
     {
         auto program = options.programs.find(appId);
-        std::string conf =
-            program == options.programs.end() ? std::string() : "exec=" + Absolute(program->second) + "\n";
-        ok = RegisterApp(appId, conf) && ok;
+        bool hasProgram = program != options.programs.end();
+        std::string conf = hasProgram ? ExecLine(program->second) : std::string();
+        // Nothing is linked into a folder that was not registered.
+        if ((hasProgram && conf.empty()) || !RegisterApp(appId, conf))
+        {
+            ok = false;
+            continue;
+        }
         ok = LinkResources(appId, options.resDir, "res") && ok;
         ok = LinkResources(appId, options.resDir, "shared/res") && ok;
     }
-    ok = RegisterApp(APP_CONTROL_BROWSER_APP_ID,
-                     "exec=" + Absolute(options.browser) + "\nview-uri=http,https\n") &&
-         ok;
+    std::string browser = ExecLine(options.browser);
+    ok = !browser.empty() && RegisterApp(APP_CONTROL_BROWSER_APP_ID, browser + "view-uri=http,https\n") && ok;
     ok =
         RegisterApp(APP_CONTROL_LOCATION_SETTING_APP_ID, std::string("exec=/bin/true\noperation=") +
                                                              APP_CONTROL_OPERATION_SETTING_LOCATION + "\n") &&
@@ -213,6 +246,12 @@ int main(int argc, char** argv)
         return 0;
     }
     std::string root = platform::RootDir();
+    std::string why;
+    if (!platform::CheckRoot(why))
+    {
+        fprintf(stderr, "platform-setup: %s\n", why.c_str());
+        return 1;
+    }
     for (const char* sub : {"apps", "log", "run"})
     {
         if (!platform::MakeDirs(platform::RootPath(sub)))

@@ -4,6 +4,7 @@
 #include <Ecore.h>
 #include <gtest/gtest.h>
 #include <sys/stat.h>
+#include <unistd.h>
 
 #include <cstdlib>
 #include <fstream>
@@ -141,6 +142,54 @@ TEST_F(AppControlTest, UnknownOrBrokenTargetsFailWithTheirCodes)
     EXPECT_EQ(APP_CONTROL_ERROR_LAUNCH_FAILED, app_control_send_launch_request(mRequest, nullptr, nullptr));
 
     EXPECT_TRUE(LaunchLog().empty());
+}
+
+TEST_F(AppControlTest, PlantedRegistryEntriesAreRefused)
+{
+    // Each would start the recorder if the registry followed it or waited on it.
+    mRoot.RegisterApp("test.real", "exec=" LAUNCH_RECORDER_PATH "\n");
+    ASSERT_EQ(symlink(mRoot.Path("apps/test.real").c_str(), mRoot.Path("apps/test.linked-folder").c_str()),
+              0);
+    mRoot.RegisterApp("test.linked-conf");
+    ASSERT_EQ(symlink(mRoot.Path("apps/test.real/app.conf").c_str(),
+                      mRoot.Path("apps/test.linked-conf/app.conf").c_str()),
+              0);
+    mRoot.RegisterApp("test.fifo-conf");
+    ASSERT_EQ(mkfifo(mRoot.Path("apps/test.fifo-conf/app.conf").c_str(), 0600), 0);
+    for (const char* appId : {"test.linked-folder", "test.linked-conf", "test.fifo-conf"})
+    {
+        app_control_set_app_id(mRequest, appId);
+        EXPECT_EQ(APP_CONTROL_ERROR_APP_NOT_FOUND,
+                  app_control_send_launch_request(mRequest, nullptr, nullptr))
+            << appId;
+    }
+    EXPECT_TRUE(LaunchLog().empty());
+}
+
+TEST_F(AppControlTest, LaunchLogIsPrivateValidJsonNeverWrittenThroughALink)
+{
+    Register(kRecorderId, "exec=" LAUNCH_RECORDER_PATH "\n");
+    app_control_set_app_id(mRequest, kRecorderId);
+    app_control_set_uri(mRequest, "file:///a\xFF!");
+    ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_add_extra_data(mRequest, "k\xC3", "v\xED\xA0\x80"));
+    ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(mRequest, nullptr, nullptr));
+    std::vector<std::string> log = LaunchLog();
+    ASSERT_EQ(1u, log.size());
+    const std::string r = "\xEF\xBF\xBD";
+    EXPECT_NE(std::string::npos, log[0].find("\"uri\":\"file:///a" + r + "!\"")) << log[0];
+    EXPECT_NE(std::string::npos, log[0].find("{\"k" + r + "\":\"v" + r + r + r + "\"}")) << log[0];
+    struct stat st;
+    ASSERT_EQ(0, stat(mRoot.Path("log/launch.log").c_str(), &st));
+    EXPECT_EQ(0600u, st.st_mode & 0777);
+
+    std::string target = mRoot.Path("target");
+    WeatherTest::WriteText(target, "");
+    unlink(mRoot.Path("log/launch.log").c_str());
+    ASSERT_EQ(0, symlink(target.c_str(), mRoot.Path("log/launch.log").c_str()));
+    ASSERT_EQ(APP_CONTROL_ERROR_NONE, app_control_send_launch_request(mRequest, nullptr, nullptr));
+    EXPECT_EQ("", WeatherTest::ReadText(target));
+    EXPECT_TRUE(mLog.Contains("cannot write the launch log", "APP_CONTROL"));
+    WaitForRecord();
 }
 
 TEST_F(AppControlTest, RequestWithoutTargetIsRefused)

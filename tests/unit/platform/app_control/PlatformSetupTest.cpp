@@ -8,6 +8,7 @@
 #include <unistd.h>
 
 #include <cstdlib>
+#include <utility>
 #include <string>
 
 #include "TestPlatform.h"
@@ -105,10 +106,38 @@ TEST_F(PlatformSetupTest, RegisteredSuiteCanBeLaunched)
     }
 }
 
-TEST_F(PlatformSetupTest, UnknownOptionIsAUsageError)
+TEST_F(PlatformSetupTest, FreshRootIsOwnerOnly)
+{
+    std::string root = mRoot.Path("fresh");
+    ASSERT_EQ(0, system((std::string(PLATFORM_SETUP_PATH) + " --root '" + root + "' >/dev/null").c_str()));
+    const std::pair<const char*, unsigned> kModes[] = {{"", 0700},
+                                                       {"/vconf/db", 0700},
+                                                       {"/vconf/db/menu_widget/language", 0600},
+                                                       {"/apps/org.tizen.browser/app.conf", 0600}};
+    for (const auto& item : kModes)
+    {
+        struct stat st;
+        ASSERT_EQ(0, lstat((root + item.first).c_str(), &st)) << item.first;
+        EXPECT_EQ(item.second, st.st_mode & 07777) << item.first;
+    }
+}
+
+TEST_F(PlatformSetupTest, BadValuesAndLinkedFoldersAreRefused)
 {
     EXPECT_EQ(2, RunSetup("--bogus"));
     EXPECT_EQ(2, RunSetup("stray"));
+    // A line break would add a line of the caller's choosing to app.conf.
+    EXPECT_EQ(2, RunSetup("--agent \"$(printf '/bin/true\\noperation=x')\""));
+    EXPECT_EQ(2, RunSetup("--browser \"$(printf '/bin/true\\rview-uri=x')\""));
+    EXPECT_NE(0, access(mRoot.Path("apps/com.quorvex.weather-m-agent/app.conf").c_str(), F_OK));
+
+    std::string elsewhere = mRoot.Path("elsewhere");
+    ASSERT_EQ(0, mkdir(elsewhere.c_str(), 0700));
+    std::string agent = mRoot.Path("apps/com.quorvex.weather-m-agent");
+    ASSERT_EQ(0, system(("rm -r '" + agent + "'").c_str()));
+    ASSERT_EQ(0, symlink(elsewhere.c_str(), agent.c_str()));
+    EXPECT_EQ(1, RunSetup("--agent /bin/true"));
+    EXPECT_EQ(0, rmdir(elsewhere.c_str())) << "nothing written through the link";
 }
 
 }  // namespace

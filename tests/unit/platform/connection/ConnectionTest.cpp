@@ -62,15 +62,33 @@ TEST_F(ConnectionTest, StatusKeyNumberingMapsOntoConnectionTypes)
     }
 }
 
-TEST_F(ConnectionTest, ChangeOfStatusReachesCallbackWithNewType)
+TEST_F(ConnectionTest, OnlyANewTypeIsReported)
 {
+    ASSERT_EQ(vconf_set_int(VCONFKEY_NETWORK_STATUS, VCONFKEY_NETWORK_WIFI), VCONF_OK);
     std::vector<int> seen;
     ASSERT_EQ(connection_set_type_changed_cb(mConnection, TypeChangedCb, &seen), CONNECTION_ERROR_NONE);
-    vconf_set_int(VCONFKEY_NETWORK_STATUS, VCONFKEY_NETWORK_CELLULAR);
-    ASSERT_TRUE(RunLoopUntil([&] { return seen.size() == 1; }, 5.0));
-    vconf_set_int(VCONFKEY_NETWORK_STATUS, VCONFKEY_NETWORK_OFF);
-    ASSERT_TRUE(RunLoopUntil([&] { return seen.size() == 2; }, 5.0));
-    EXPECT_EQ(seen, (std::vector<int>{CONNECTION_TYPE_CELLULAR, CONNECTION_TYPE_DISCONNECTED}));
+    // Rewrites of the same type, then one change; 17 and -1 read as disconnected.
+    const struct
+    {
+        std::vector<int> writes;
+        int type;
+    } kSteps[] = {
+        {{VCONFKEY_NETWORK_WIFI, VCONFKEY_NETWORK_WIFI, VCONFKEY_NETWORK_CELLULAR}, CONNECTION_TYPE_CELLULAR},
+        {{VCONFKEY_NETWORK_CELLULAR, VCONFKEY_NETWORK_OFF, 17, -1}, CONNECTION_TYPE_DISCONNECTED},
+        {{VCONFKEY_NETWORK_OFF, VCONFKEY_NETWORK_ETHERNET}, CONNECTION_TYPE_ETHERNET},
+    };
+    std::vector<int> expected;
+    for (const auto& step : kSteps)
+    {
+        for (int status : step.writes)
+        {
+            ASSERT_EQ(vconf_set_int(VCONFKEY_NETWORK_STATUS, status), VCONF_OK);
+            RunLoopFor(0.02);
+        }
+        expected.push_back(step.type);
+        ASSERT_TRUE(RunLoopUntil([&] { return seen.size() >= expected.size(); }, 5.0));
+        EXPECT_EQ(seen, expected);
+    }
 }
 
 TEST_F(ConnectionTest, SeveralHandlesEachHearChangesUntilUnset)
@@ -104,7 +122,8 @@ TEST_F(ConnectionTest, BadHandlesAndArgumentsAreRejected)
     EXPECT_EQ(connection_get_type(nullptr, &type), CONNECTION_ERROR_INVALID_PARAMETER);
     EXPECT_EQ(connection_get_type(&notAHandle, &type), CONNECTION_ERROR_INVALID_PARAMETER);
     EXPECT_EQ(connection_get_type(mConnection, nullptr), CONNECTION_ERROR_INVALID_PARAMETER);
-    EXPECT_EQ(connection_set_type_changed_cb(mConnection, nullptr, nullptr), CONNECTION_ERROR_INVALID_PARAMETER);
+    EXPECT_EQ(connection_set_type_changed_cb(mConnection, nullptr, nullptr),
+              CONNECTION_ERROR_INVALID_PARAMETER);
     EXPECT_EQ(connection_unset_type_changed_cb(&notAHandle), CONNECTION_ERROR_INVALID_PARAMETER);
     EXPECT_EQ(connection_destroy(mConnection), CONNECTION_ERROR_NONE);
     // A second destroy of the same handle is refused, not a double free.

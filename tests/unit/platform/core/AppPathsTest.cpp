@@ -3,6 +3,8 @@
 
 #include <gtest/gtest.h>
 
+#include <unistd.h>
+
 #include <cstdlib>
 #include <string>
 
@@ -42,6 +44,10 @@ TEST_F(AppPathsTest, UnknownOrUnsafeIdsFail)
     EXPECT_EQ(app_manager_get_shared_data_path(nullptr, &path), APP_MANAGER_ERROR_INVALID_PARAMETER);
     EXPECT_EQ(app_manager_get_shared_resource_path("com.quorvex.weather-m", nullptr),
               APP_MANAGER_ERROR_INVALID_PARAMETER);
+    // A linked application folder could send our data anywhere.
+    ASSERT_EQ(
+        symlink(mRoot.Path("apps/com.quorvex.weather-m").c_str(), mRoot.Path("apps/test.linked").c_str()), 0);
+    EXPECT_EQ(app_manager_get_shared_data_path("test.linked", &path), APP_MANAGER_ERROR_NO_SUCH_APP);
 }
 
 TEST_F(AppPathsTest, ResourcePathFollowsOwnId)

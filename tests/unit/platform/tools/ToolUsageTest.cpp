@@ -4,6 +4,7 @@
 
 #include <cstdlib>
 #include <string>
+#include <utility>
 
 #include "TestFiles.h"
 #include "TestPlatform.h"
@@ -65,6 +66,25 @@ TEST_F(ToolUsageTest, BadUsageStillFailsOnTheErrorStream)
         EXPECT_NE(std::string::npos, mErr.find(std::string("usage: ") + tool.name)) << mErr;
         EXPECT_EQ("", mOut);
     }
+}
+
+TEST_F(ToolUsageTest, RootThatOthersCanWriteStopsTheTools)
+{
+    std::string root = mRoot.Path("shared");
+    ASSERT_EQ(0, mkdir(root.c_str(), 0777));
+    ASSERT_EQ(0, chmod(root.c_str(), 0777));
+    const std::pair<const Tool&, std::string> kRuns[] = {{kTools[0], "--reset"},
+                                                         {kTools[1], "get db/menu_widget/language"}};
+    for (const auto& [tool, args] : kRuns)
+    {
+        SCOPED_TRACE(tool.name);
+        setenv("PLATFORM_ROOT", root.c_str(), 1);
+        EXPECT_EQ(1, Run(tool, args));
+        setenv("PLATFORM_ROOT", mRoot.GetPath().c_str(), 1);
+        EXPECT_NE(std::string::npos, mErr.find(root + " is refused")) << mErr;
+    }
+    struct stat st;
+    EXPECT_NE(0, stat((root + "/vconf").c_str(), &st));
 }
 
 TEST_F(ToolUsageTest, SetupHelpLeavesTheRootAlone)

@@ -1,6 +1,8 @@
 #include <quorvex_log_manager.h>
 
 #include <Ecore.h>
+#include <sys/stat.h>
+#include <unistd.h>
 #include <gtest/gtest.h>
 
 #include <string>
@@ -102,15 +104,29 @@ TEST_F(UsageLogClientTest, DestroyDropsPendingCompletions)
     EXPECT_EQ(2u, Records().size());
 }
 
-TEST_F(UsageLogClientTest, UnwritableLogIsAnIoError)
+TEST_F(UsageLogClientTest, LogThatIsNotOurPlainFileIsAnIoError)
 {
-    bundle_add_str(mData, "k", "v");
-    // A folder where the log file should be.
+    bundle_add_str(mData, "k", "v\xFF");
+    ASSERT_GT(quorvex_log_manager_insert(mManager, "content://a", mData, nullptr, nullptr), 0);
+    EXPECT_EQ("{\"k\":\"v\xEF\xBF\xBD\"}}", Records().at(0).substr(Records()[0].find("{\"k")));
     std::string logPath = mRoot.Path("log/usage.log");
-    ASSERT_EQ(0, system(("mkdir -p '" + logPath + "'").c_str()));
-    EXPECT_EQ(QUORVEX_LOG_MANAGER_ERROR_IO_ERROR,
-              quorvex_log_manager_insert(mManager, "content://a", mData, CompletedCb, &mCompleted));
-    EXPECT_TRUE(mLog.Contains("cannot write the usage log", "USAGE_LOG"));
+    struct stat st;
+    ASSERT_EQ(0, stat(logPath.c_str(), &st));
+    EXPECT_EQ(0600u, st.st_mode & 0777);
+
+    // A folder, then a planted link, where the log file should be.
+    std::string target = mRoot.Path("target");
+    WeatherTest::WriteText(target, "");
+    for (bool asLink : {false, true})
+    {
+        unlink(logPath.c_str());
+        ASSERT_EQ(0, asLink ? symlink(target.c_str(), logPath.c_str()) : mkdir(logPath.c_str(), 0700));
+        EXPECT_EQ(QUORVEX_LOG_MANAGER_ERROR_IO_ERROR,
+                  quorvex_log_manager_insert(mManager, "content://a", mData, CompletedCb, &mCompleted));
+        rmdir(logPath.c_str());
+    }
+    EXPECT_EQ("", WeatherTest::ReadText(target));
+    EXPECT_EQ(2, mLog.Count("cannot write the usage log", "USAGE_LOG"));
     WeatherTest::RunLoopFor(0.05);
     EXPECT_TRUE(mCompleted.empty());
 }

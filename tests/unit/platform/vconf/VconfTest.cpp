@@ -2,10 +2,15 @@
 
 #include <gtest/gtest.h>
 
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <cmath>
 #include <cstdlib>
 #include <locale>
 #include <string>
 
+#include "TestFiles.h"
 #include "TestPlatform.h"
 #include "core/PlatformRoot.h"
 
@@ -95,9 +100,17 @@ TEST_F(VconfTest, WrongTypeOrMissingKeyIsAnErrorWithALogLine)
 
 TEST_F(VconfTest, GarbageContentIsRejected)
 {
-    const char* const kGarbage[] = {"", "int", "int\n", "int\nforty\n", "int\n42abc\n",
-                                    "int\n99999999999\n", "bool\n2\n", "double\n1,5\n",
-                                    "double\nnan\n", "float\n1\n", "\x01\x02\xff\n\n"};
+    const char* const kGarbage[] = {"",
+                                    "int",
+                                    "int\n",
+                                    "int\nforty\n",
+                                    "int\n42abc\n",
+                                    "int\n99999999999\n",
+                                    "bool\n2\n",
+                                    "double\n1,5\n",
+                                    "double\nnan\n",
+                                    "float\n1\n",
+                                    "\x01\x02\xff\n\n"};
     for (const char* content : kGarbage)
     {
         SCOPED_TRACE(content);
@@ -115,8 +128,8 @@ TEST_F(VconfTest, GarbageContentIsRejected)
 
 TEST_F(VconfTest, BadKeyNamesAreRejectedBeforeTouchingFiles)
 {
-    const char* const kBadKeys[] = {"", "/db/abs", "db//twice", "db/trailing/", "../escape",
-                                    "db/../../escape", "db/./dot", "."};
+    const char* const kBadKeys[] = {"",          "/db/abs",         "db//twice", "db/trailing/",
+                                    "../escape", "db/../../escape", "db/./dot",  "."};
     for (const char* key : kBadKeys)
     {
         SCOPED_TRACE(key);
@@ -132,6 +145,42 @@ TEST_F(VconfTest, BadKeyNamesAreRejectedBeforeTouchingFiles)
     std::string escaped;
     EXPECT_FALSE(platform::ReadFile(mRoot.Path("escape"), escaped));
     EXPECT_FALSE(platform::ReadFile(mRoot.GetPath() + "/../escape", escaped));
+}
+
+TEST_F(VconfTest, KeyFilesThatAreNotPlainFilesAreRefused)
+{
+    std::string outside = mRoot.Path("outside");
+    WeatherTest::WriteText(outside, "int\n5\n");
+    std::string dir = mRoot.Path("vconf/db/test");
+    ASSERT_TRUE(platform::MakeDirs(dir + "/folder"));
+    ASSERT_EQ(symlink(outside.c_str(), (dir + "/link").c_str()), 0);
+    ASSERT_EQ(mkfifo((dir + "/fifo").c_str(), 0600), 0);
+    WeatherTest::MakeSparseFile(dir + "/huge", 64L * 1024 * 1024);
+    long before = WeatherTest::BytesReadSoFar();
+    for (const char* key : {"db/test/link", "db/test/fifo", "db/test/folder", "db/test/huge"})
+    {
+        int value = 0;
+        EXPECT_EQ(vconf_get_int(key, &value), VCONF_ERROR) << key;
+    }
+    EXPECT_LT(WeatherTest::BytesReadSoFar() - before, 1024 * 1024);
+    // A write replaces the planted link; what it pointed at stays as it was.
+    ASSERT_EQ(vconf_set_int("db/test/link", 6), VCONF_OK);
+    EXPECT_EQ(WeatherTest::ReadText(outside), "int\n5\n");
+    struct stat st;
+    ASSERT_EQ(lstat((dir + "/link").c_str(), &st), 0);
+    EXPECT_TRUE(S_ISREG(st.st_mode));
+    EXPECT_EQ(st.st_mode & 0777, 0600u);
+}
+
+TEST_F(VconfTest, SetRefusesWhatGetWouldRefuse)
+{
+    EXPECT_EQ(vconf_set_str("db/test/long", std::string(64 * 1024, 'x').c_str()), VCONF_ERROR);
+    EXPECT_EQ(vconf_set_dbl("db/test/nan", std::nan("")), VCONF_ERROR);
+    EXPECT_EQ(vconf_set_dbl("db/test/inf", HUGE_VAL), VCONF_ERROR);
+    for (const char* key : {"db/test/long", "db/test/nan", "db/test/inf"})
+        EXPECT_TRUE(ReadRaw(key).empty()) << key;
+    EXPECT_EQ(vconf_set_str("db/test/long", std::string(60 * 1024, 'x').c_str()), VCONF_OK);
+    EXPECT_EQ(GetStr("db/test/long").size(), 60u * 1024);
 }
 
 }  // namespace

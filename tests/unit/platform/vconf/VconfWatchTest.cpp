@@ -5,6 +5,7 @@
 
 #include <cerrno>
 #include <cstdio>
+#include <filesystem>
 #include <string>
 #include <sys/select.h>
 #include <sys/wait.h>
@@ -57,8 +58,7 @@ int RunTool(std::vector<std::string> args)
 {
     std::string tool = ToolPath();
     std::vector<char*> argv{&tool[0]};
-    for (std::string& arg : args)
-        argv.push_back(&arg[0]);
+    for (std::string& arg : args) argv.push_back(&arg[0]);
     argv.push_back(nullptr);
     pid_t pid = fork();
     if (pid == 0)
@@ -150,6 +150,28 @@ TEST_F(VconfWatchTest, GarbageWriteIsLoggedAndNotDelivered)
     EXPECT_EQ(mSeen, Seen{"memory/dnet/status=3"});
 }
 
+TEST_F(VconfWatchTest, WatchOutlivesItsFolderBeingRemoved)
+{
+    ASSERT_EQ(vconf_notify_key_changed("memory/dnet/status", FirstCb, &mSeen), VCONF_OK);
+    for (const char* removed : {"vconf/memory/dnet", "vconf/memory", "vconf"})
+    {
+        SCOPED_TRACE(removed);
+        std::filesystem::remove_all(mRoot.Path(removed));
+        // Seen removed or not yet: the next write is reported either way.
+        RunLoopFor(0.05);
+        mSeen.clear();
+        ASSERT_EQ(vconf_set_int("memory/dnet/status", 3), VCONF_OK);
+        ASSERT_TRUE(RunLoopUntil([&] { return !mSeen.empty(); }, 5.0));
+        EXPECT_EQ(mSeen.back(), "memory/dnet/status=3");
+    }
+    // Without its root the watch says it stopped.
+    {
+        WeatherTest::TestPlatformRoot inner;
+        ASSERT_EQ(vconf_notify_key_changed("memory/dnet/other", SecondCb, &mSeen), VCONF_OK);
+    }
+    EXPECT_TRUE(RunLoopUntil([&] { return mLog.Contains("memory/dnet/other is no longer watched"); }, 5.0));
+}
+
 TEST_F(VconfWatchTest, KeySetByToolInAnotherProcessReachesWatcher)
 {
     ASSERT_EQ(vconf_notify_key_changed("memory/dnet/status", FirstCb, &mSeen), VCONF_OK);
@@ -181,8 +203,7 @@ TEST_F(VconfWatchTest, ToolWatchPrintsTheNewValueAndStopsAfterCount)
     ASSERT_TRUE(printed);
     std::string all;
     char line[64];
-    while (fgets(line, sizeof(line), out))
-        all += line;
+    while (fgets(line, sizeof(line), out)) all += line;
     EXPECT_EQ(pclose(out), 0);
     EXPECT_EQ(all, "new value\n");
 }
