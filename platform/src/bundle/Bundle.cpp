@@ -118,6 +118,12 @@ extern "C" int bundle_encode(bundle* b, bundle_raw** raw, int* len)
 {
     if (!b || !raw || !len)
         return Fail(BUNDLE_ERROR_INVALID_PARAMETER);
+    if (b->items.size() > platform::kMaxBundleEntries)
+    {
+        dlog_print(DLOG_ERROR, "BUNDLE", "cannot encode %zu entries (at most %zu)", b->items.size(),
+                   platform::kMaxBundleEntries);
+        return Fail(BUNDLE_ERROR_INVALID_PARAMETER);
+    }
     std::string text = platform::Base64Encode(platform::BundleToBinary(b));
     char* copy = static_cast<char*>(malloc(text.size() + 1));
     if (!copy)

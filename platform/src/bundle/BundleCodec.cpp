@@ -3,6 +3,8 @@
 
 #include <cstdint>
 #include <cstdio>
+#include <string_view>
+#include <unordered_set>
 
 namespace
 {
@@ -50,7 +52,9 @@ private:
     size_t mPos = 0;
 };
 
-bool ReadEntry(Reader& reader, bundle* b)
+// `keys` views the keys read so far (entries stay put on the heap), so that
+// a duplicate costs one lookup rather than a scan of the entries.
+bool ReadEntry(Reader& reader, bundle* b, std::unordered_set<std::string_view>& keys)
 {
     uint32_t type = 0;
     auto item = std::make_unique<keyval_t>();
@@ -58,7 +62,7 @@ bool ReadEntry(Reader& reader, bundle* b)
         return false;
     if (!reader.GetText(item->key) || item->key.empty() || !reader.GetText(item->value))
         return false;
-    if (platform::BundleFind(b, item->key))
+    if (!keys.insert(item->key).second)
         return false;
     item->type = BUNDLE_TYPE_STR;
     b->items.push_back(std::move(item));
@@ -120,11 +124,14 @@ bundle* BundleFromBinary(const std::string& data)
     reader.Skip(sizeof(kMagic) + 1);
     uint32_t count = 0;
     // The count cannot promise more entries than the bytes can hold.
-    if (!reader.GetU32(count) || count > reader.Remaining() / kEntryHeader)
+    if (!reader.GetU32(count) || count > reader.Remaining() / kEntryHeader || count > kMaxBundleEntries)
         return nullptr;
     auto b = std::make_unique<_bundle_t>();
+    std::unordered_set<std::string_view> keys;
+    keys.reserve(count);
+    b->items.reserve(count);
     for (uint32_t i = 0; i < count; ++i)
-        if (!ReadEntry(reader, b.get()))
+        if (!ReadEntry(reader, b.get(), keys))
             return nullptr;
     if (reader.Remaining() != 0)
         return nullptr;

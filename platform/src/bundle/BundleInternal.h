@@ -26,6 +26,10 @@ struct _bundle_t
 namespace platform
 {
 
+// More entries than any message or launch request of ours carries; the
+// decoder refuses more, and so does bundle_encode.
+const size_t kMaxBundleEntries = 4096;
+
 // "QBND", version, count, then per entry type, key and value, each length
 // prefixed (big-endian 32-bit).
 std::string BundleToBinary(const bundle* b);

@@ -5,6 +5,7 @@
 #include <fcntl.h>
 #include <mutex>
 #include <string>
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include "core/PlatformRoot.h"
@@ -25,18 +26,61 @@ char PriorityLetter(log_priority prio)
     return prio >= DLOG_UNKNOWN && prio < DLOG_PRIO_MAX ? kLetters[prio] : '?';
 }
 
+// One old file is kept beside the current one, so the log stays bounded.
+const off_t kRotateBytes = 2 * 1024 * 1024;
+
+// Our own regular file only: never a planted link, FIFO or device.
+int OpenLogFile(const std::string& path)
+{
+    int fd = open(path.c_str(), O_WRONLY | O_CREAT | O_APPEND | O_CLOEXEC | O_NOFOLLOW | O_NONBLOCK, 0600);
+    struct stat info;
+    if (fd >= 0 && (fstat(fd, &info) != 0 || !S_ISREG(info.st_mode) || info.st_uid != geteuid()))
+    {
+        close(fd);
+        return -1;
+    }
+    // A file left by an older build may still be readable by others.
+    if (fd >= 0 && (info.st_mode & 077) != 0)
+        fchmod(fd, 0600);
+    return fd;
+}
+
+void CloseLog()
+{
+    if (gFd >= 0)
+        close(gFd);
+    gFd = -1;
+    gOpenPath.clear();
+}
+
 int LogFd()
 {
     std::string path = platform::RootPath("log/dlog.log");
     if (gFd >= 0 && path == gOpenPath)
         return gFd;
-    if (gFd >= 0)
-        close(gFd);
-    gFd = -1;
+    CloseLog();
     if (platform::MakeDirs(platform::RootPath("log")))
-        gFd = open(path.c_str(), O_WRONLY | O_CREAT | O_APPEND | O_CLOEXEC, 0644);
-    gOpenPath = gFd >= 0 ? path : std::string();
+        gFd = OpenLogFile(path);
+    if (gFd >= 0)
+        gOpenPath = path;
     return gFd;
+}
+
+// Once the file is full it becomes dlog.log.1. Another process may have
+// moved it already; then only the new file is opened.
+void RotateIfFull()
+{
+    struct stat open;
+    struct stat named;
+    if (gFd < 0 || fstat(gFd, &open) != 0 || open.st_size < kRotateBytes)
+        return;
+    std::string path = gOpenPath;
+    if (lstat(path.c_str(), &named) == 0 && named.st_ino == open.st_ino && named.st_dev == open.st_dev)
+        rename(path.c_str(), (path + ".1").c_str());
+    CloseLog();
+    gFd = OpenLogFile(path);
+    if (gFd >= 0)
+        gOpenPath = path;
 }
 
 void WriteAll(int fd, const std::string& line)
@@ -90,7 +134,10 @@ extern "C" int dlog_vprint(log_priority prio, const char* tag, const char* fmt, 
     std::lock_guard<std::mutex> lock(gMutex);
     int fd = LogFd();
     if (fd >= 0)
+    {
         WriteAll(fd, line);
+        RotateIfFull();
+    }
     const char* toStderr = getenv("DLOG_STDERR");
     if (toStderr && toStderr[0] == '1')
         WriteAll(STDERR_FILENO, line);

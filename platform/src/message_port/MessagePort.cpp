@@ -19,6 +19,7 @@
 #include "core/PlatformRoot.h"
 #include "core/UnixSocket.h"
 #include "dlog.h"
+#include "dlog/LogLimiter.h"
 #include "message_port/MessageEnvelope.h"
 
 namespace
@@ -28,8 +29,10 @@ const char* const kLogTag = "MESSAGE_PORT";
 const size_t kMaxMessageBytes = 16 * 1024;
 // The envelope adds base64 and the sender's names to the message.
 const size_t kMaxDatagramBytes = 64 * 1024;
-// Datagrams read per wake-up, so that a flood cannot starve the loop.
+// Work per wake-up, so that a flood cannot starve the loop: a count for
+// small datagrams, bytes for large ones.
 const int kMaxReadsPerWake = 64;
+const size_t kMaxBytesPerWake = 256 * 1024;
 
 struct LocalPort
 {
@@ -40,6 +43,8 @@ struct LocalPort
     Ecore_Fd_Handler* handler = nullptr;
     message_port_message_cb callback = nullptr;
     void* userData = nullptr;
+    // Main loop only; released when the port is unregistered.
+    std::unique_ptr<platform::LogLimiter> dropLog;
 };
 using LocalPortPtr = std::shared_ptr<LocalPort>;
 
@@ -73,13 +78,20 @@ bool IsValidPortName(const char* name)
     return name && platform::IsSafeName(name) && strlen(name) <= 255;
 }
 
+void LogDrop(const LocalPortPtr& port, const char* what, size_t bytes)
+{
+    std::string line =
+        std::string("dropped ") + what + " of " + std::to_string(bytes) + " bytes on port " + port->name;
+    if (port->dropLog)
+        port->dropLog->Log(line);
+}
+
 void Deliver(const LocalPortPtr& port, const std::string& datagram)
 {
     platform::MessageEnvelope envelope;
     if (!platform::DecodeEnvelope(datagram, envelope))
     {
-        dlog_print(DLOG_ERROR, kLogTag, "dropped a malformed message of %zu bytes on port %s",
-                   datagram.size(), port->name.c_str());
+        LogDrop(port, "a malformed message", datagram.size());
         return;
     }
     port->callback(port->id, envelope.senderAppId.c_str(),
@@ -88,29 +100,31 @@ void Deliver(const LocalPortPtr& port, const std::string& datagram)
     bundle_free(envelope.message);
 }
 
-// Returns false when nothing more is waiting (or the port went away).
-bool ReadOne(int id)
+// The size of the datagram read, or -1 when nothing more is waiting (or the
+// port went away).
+ssize_t ReadOne(int id, std::string& buffer)
 {
     LocalPortPtr port = FindPort(id);
     if (!port)
-        return false;
-    std::string buffer(kMaxDatagramBytes, '\0');
+        return -1;
+    buffer.resize(kMaxDatagramBytes);
     ssize_t n = recv(port->fd, &buffer[0], buffer.size(), MSG_DONTWAIT | MSG_TRUNC);
     if (n < 0)
     {
-        if (errno != EAGAIN && errno != EWOULDBLOCK && errno != EINTR)
+        if (errno == EINTR)
+            return 0;
+        if (errno != EAGAIN && errno != EWOULDBLOCK)
             dlog_print(DLOG_ERROR, kLogTag, "recv on port %s failed (errno %d)", port->name.c_str(), errno);
-        return errno == EINTR;
+        return -1;
     }
     if (static_cast<size_t>(n) > buffer.size())
     {
-        dlog_print(DLOG_ERROR, kLogTag, "dropped an oversized message of %zd bytes on port %s", n,
-                   port->name.c_str());
-        return true;
+        LogDrop(port, "an oversized message", static_cast<size_t>(n));
+        return static_cast<ssize_t>(buffer.size());
     }
     buffer.resize(static_cast<size_t>(n));
     Deliver(port, buffer);
-    return true;
+    return n;
 }
 
 Eina_Bool PortReadableCb(void* data, Ecore_Fd_Handler*)
@@ -118,8 +132,14 @@ Eina_Bool PortReadableCb(void* data, Ecore_Fd_Handler*)
     try
     {
         int id = static_cast<int>(reinterpret_cast<intptr_t>(data));
-        for (int i = 0; i < kMaxReadsPerWake && ReadOne(id); ++i)
+        std::string buffer;
+        size_t bytes = 0;
+        for (int i = 0; i < kMaxReadsPerWake && bytes < kMaxBytesPerWake; ++i)
         {
+            ssize_t n = ReadOne(id, buffer);
+            if (n < 0)
+                break;
+            bytes += static_cast<size_t>(n);
         }
     }
     catch (...)
@@ -148,9 +168,17 @@ int OpenPortSocket(const std::string& name, const std::string& path)
     }
 }
 
+// The sockets' folder is ours alone; a link planted in its place is refused.
+bool PreparePortDir()
+{
+    struct stat info;
+    return platform::MakeDirs(PortDir()) && lstat(PortDir().c_str(), &info) == 0 && S_ISDIR(info.st_mode) &&
+           info.st_uid == geteuid() && chmod(PortDir().c_str(), 0700) == 0;
+}
+
 int AddPort(const char* name, message_port_message_cb callback, void* userData)
 {
-    if (!platform::MakeDirs(PortDir()) || chmod(PortDir().c_str(), 0700) != 0)
+    if (!PreparePortDir())
     {
         dlog_print(DLOG_ERROR, kLogTag, "cannot create %s (errno %d)", PortDir().c_str(), errno);
         return MESSAGE_PORT_ERROR_IO_ERROR;
@@ -163,6 +191,7 @@ int AddPort(const char* name, message_port_message_cb callback, void* userData)
         return port->fd;
     port->callback = callback;
     port->userData = userData;
+    port->dropLog = std::make_unique<platform::LogLimiter>(DLOG_ERROR, kLogTag);
     {
         std::lock_guard<std::mutex> lock(gMutex);
         port->id = gNextId++;
@@ -262,6 +291,7 @@ extern "C" int message_port_unregister_local_port(int localPortId)
         port = it->second;
         gPorts.erase(it);
     }
+    port->dropLog.reset();
     if (port->handler)
     {
         ecore_main_fd_handler_del(port->handler);

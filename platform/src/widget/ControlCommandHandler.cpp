@@ -34,13 +34,15 @@ std::string Flatten(std::string text)
 
 ControlCommandHandler::ControlCommandHandler(WidgetHost& host) : mHost(host)
 {
-    mIdleWatcher = std::make_unique<IdleWatcher>([this]() {
-        std::vector<Evas*> canvases;
-        for (WidgetInstance* instance : mHost.GetInstances())
-            if (Evas* canvas = instance->GetWindowCanvas())
-                canvases.push_back(canvas);
-        return canvases;
-    });
+    mIdleWatcher = std::make_unique<IdleWatcher>(
+        [this]()
+        {
+            std::vector<Evas*> canvases;
+            for (WidgetInstance* instance : mHost.GetInstances())
+                if (Evas* canvas = instance->GetWindowCanvas())
+                    canvases.push_back(canvas);
+            return canvases;
+        });
 }
 
 ControlCommandHandler::~ControlCommandHandler()
@@ -50,8 +52,8 @@ ControlCommandHandler::~ControlCommandHandler()
 
 int ControlCommandHandler::Start(const std::string& socketPath)
 {
-    mServer = std::make_unique<ControlServer>(
-        [this](const std::string& line, const ReplyCb& reply) { Handle(line, reply); });
+    mServer = std::make_unique<ControlServer>([this](const std::string& line, const ReplyCb& reply)
+                                              { Handle(line, reply); });
     return mServer->Start(socketPath);
 }
 
@@ -66,8 +68,7 @@ ControlCommandHandler::Words ControlCommandHandler::Split(const std::string& lin
     Words words;
     std::istringstream stream(line);
     std::string word;
-    while (stream >> word)
-        words.push_back(word);
+    while (stream >> word) words.push_back(word);
     return words;
 }
 
@@ -95,12 +96,12 @@ void ControlCommandHandler::Handle(const std::string& line, const ReplyCb& reply
 {
     using Command = std::string (ControlCommandHandler::*)(const Words&);
     static const std::map<std::string, Command> kCommands = {
-        {"create", &ControlCommandHandler::Create},    {"resize", &ControlCommandHandler::Lifecycle},
-        {"pause", &ControlCommandHandler::Lifecycle},  {"resume", &ControlCommandHandler::Lifecycle},
+        {"create", &ControlCommandHandler::Create},     {"resize", &ControlCommandHandler::Lifecycle},
+        {"pause", &ControlCommandHandler::Lifecycle},   {"resume", &ControlCommandHandler::Lifecycle},
         {"destroy", &ControlCommandHandler::Lifecycle}, {"update", &ControlCommandHandler::Update},
-        {"list", &ControlCommandHandler::List},        {"tap", &ControlCommandHandler::Tap},
-        {"swipe", &ControlCommandHandler::Swipe},      {"snapshot", &ControlCommandHandler::Snapshot},
-        {"dump", &ControlCommandHandler::Dump},        {"event", &ControlCommandHandler::Event},
+        {"list", &ControlCommandHandler::List},         {"tap", &ControlCommandHandler::Tap},
+        {"swipe", &ControlCommandHandler::Swipe},       {"snapshot", &ControlCommandHandler::Snapshot},
+        {"dump", &ControlCommandHandler::Dump},         {"event", &ControlCommandHandler::Event},
         {"exit", &ControlCommandHandler::Exit},
     };
     Words words = Split(line);
@@ -154,20 +155,26 @@ std::string ControlCommandHandler::Lifecycle(const Words& words)
 std::string ControlCommandHandler::Update(const Words& words)
 {
     int force = 1;
-    if (words.size() < 2 || words.size() > 3 || (words.size() == 3 && (!ParseInt(words[2], force) || force < 0)))
+    if (words.size() < 2 || words.size() > 3 ||
+        (words.size() == 3 && (!ParseInt(words[2], force) || force < 0)))
         return "ERR usage: update <id> [force 0|1]";
     if (!mHost.FindInstance(words[1]))
         return "ERR unknown instance " + words[1];
     return Result("update", mHost.UpdateInstance(words[1], nullptr, force != 0));
 }
 
-std::string ControlCommandHandler::Exit(const Words&)
+std::string ControlCommandHandler::Exit(const Words& words)
 {
+    // "exit now" from a script is more likely a mistake than a request.
+    if (words.size() != 1)
+        return "ERR usage: exit";
     return mHost.Exit() == 0 ? "OK" : "ERR not running";
 }
 
-std::string ControlCommandHandler::List(const Words&)
+std::string ControlCommandHandler::List(const Words& words)
 {
+    if (words.size() != 1)
+        return "ERR usage: list";
     auto instances = mHost.GetInstances();
     std::string reply = "OK " + std::to_string(instances.size());
     for (WidgetInstance* instance : instances)
@@ -204,16 +211,15 @@ std::string ControlCommandHandler::Swipe(const Words& words)
 {
     int values[5] = {};
     bool parsed = words.size() == 7;
-    for (size_t i = 0; parsed && i < 5; ++i)
-        parsed = ParseInt(words[i + 2], values[i]);
+    for (size_t i = 0; parsed && i < 5; ++i) parsed = ParseInt(words[i + 2], values[i]);
     if (!parsed || values[4] < 0 || values[4] > kMaxGestureMs)
         return "ERR usage: swipe <id> <x1> <y1> <x2> <y2> <ms>";
     std::string error;
     WidgetInstance* instance = FindDrawn(words, error);
     if (!instance)
         return error;
-    unsigned start = InputFeeder::Swipe(instance->GetWindowCanvas(), values[0], values[1], values[2], values[3],
-                       static_cast<unsigned>(values[4]));
+    unsigned start = InputFeeder::Swipe(instance->GetWindowCanvas(), values[0], values[1], values[2],
+                                        values[3], static_cast<unsigned>(values[4]));
     return "OK " + std::to_string(start);
 }
 
@@ -275,9 +281,8 @@ void ControlCommandHandler::Idle(const Words& words, const ReplyCb& reply)
         reply("ERR usage: idle [seconds]");
         return;
     }
-    mIdleWatcher->Wait(seconds, [reply](const std::string& pending) {
-        reply(pending.empty() ? "OK" : "ERR timeout: " + pending);
-    });
+    mIdleWatcher->Wait(seconds, [reply](const std::string& pending)
+                       { reply(pending.empty() ? "OK" : "ERR timeout: " + pending); });
 }
 
 }  // namespace platform

@@ -7,7 +7,6 @@
 
 #include "core/PlatformRoot.h"
 #include "core/UnixSocket.h"
-#include "dlog.h"
 #include "widget_errno.h"
 
 namespace platform
@@ -16,6 +15,10 @@ namespace platform
 namespace
 {
 const char* const kLogTag = "widget-host";
+const size_t kReadChunk = 16384;
+// Out of descriptors: connections wait in the backlog instead of waking the
+// loop over and over.
+const double kAcceptPauseSeconds = 0.2;
 
 // A socket address can hold it and its folder exists (or has been made).
 bool IsUsablePath(const std::string& path)
@@ -25,18 +28,9 @@ bool IsUsablePath(const std::string& path)
     return MakeUnixAddress(path, address) && slash != std::string::npos && MakeDirs(path.substr(0, slash));
 }
 
-void WriteAll(int fd, const std::string& text)
+bool IsOutOfDescriptors(int error)
 {
-    size_t done = 0;
-    while (done < text.size())
-    {
-        ssize_t written = send(fd, text.data() + done, text.size() - done, MSG_NOSIGNAL);
-        if (written < 0 && errno == EINTR)
-            continue;
-        if (written <= 0)
-            return;
-        done += static_cast<size_t>(written);
-    }
+    return error == EMFILE || error == ENFILE || error == ENOBUFS || error == ENOMEM;
 }
 }  // namespace
 
@@ -62,7 +56,7 @@ int ControlServer::Start(const std::string& path)
         dlog_print(DLOG_ERROR, kLogTag, "another host already answers on %s", path.c_str());
         return WIDGET_ERROR_ALREADY_STARTED;
     }
-    if (result != UnixBindResult::BOUND || listen(mListenFd, 16) != 0)
+    if (result != UnixBindResult::BOUND || listen(mListenFd, kBacklog) != 0)
     {
         dlog_print(DLOG_ERROR, kLogTag, "control socket %s: %s", path.c_str(), strerror(errno));
         Stop();
@@ -75,8 +69,10 @@ int ControlServer::Start(const std::string& path)
 
 void ControlServer::Stop()
 {
-    while (!mClients.empty())
-        Close(mClients.begin()->first);
+    while (!mClients.empty()) Close(mClients.begin()->first);
+    if (mAcceptPauseTimer)
+        ecore_timer_del(mAcceptPauseTimer);
+    mAcceptPauseTimer = nullptr;
     if (mListenHandler)
         ecore_main_fd_handler_del(mListenHandler);
     mListenHandler = nullptr;
@@ -105,25 +101,68 @@ Eina_Bool ControlServer::AcceptCb(void* data, Ecore_Fd_Handler*)
 
 void ControlServer::Accept()
 {
-    int fd = accept4(mListenFd, nullptr, nullptr, SOCK_CLOEXEC);
+    int fd = accept4(mListenFd, nullptr, nullptr, SOCK_CLOEXEC | SOCK_NONBLOCK);
     if (fd < 0)
+    {
+        if (IsOutOfDescriptors(errno))
+        {
+            mLimitLog.Log(std::string("cannot accept a control client: ") + strerror(errno));
+            PauseAccept();
+        }
         return;
+    }
+    if (mClients.size() >= kMaxClients)
+    {
+        static const char kRefusal[] = "ERR too many clients\n";
+        send(fd, kRefusal, sizeof(kRefusal) - 1, MSG_NOSIGNAL | MSG_DONTWAIT);
+        close(fd);
+        mLimitLog.Log("refused a control client: " + std::to_string(kMaxClients) + " are connected");
+        return;
+    }
     auto client = std::make_unique<Client>();
     client->server = this;
     client->id = mNextClientId++;
     client->fd = fd;
     client->handler = ecore_main_fd_handler_add(fd, ECORE_FD_READ, ClientCb, client.get(), nullptr, nullptr);
+    if (!client->handler)
+    {
+        close(fd);
+        return;
+    }
     mClients[client->id] = std::move(client);
 }
 
-Eina_Bool ControlServer::ClientCb(void* data, Ecore_Fd_Handler*)
+void ControlServer::PauseAccept()
+{
+    if (mAcceptPauseTimer || !mListenHandler)
+        return;
+    ecore_main_fd_handler_del(mListenHandler);
+    mListenHandler = nullptr;
+    mAcceptPauseTimer = ecore_timer_add(kAcceptPauseSeconds, ResumeAcceptCb, this);
+}
+
+Eina_Bool ControlServer::ResumeAcceptCb(void* data)
+{
+    auto* server = static_cast<ControlServer*>(data);
+    if (!server)
+        return ECORE_CALLBACK_CANCEL;
+    server->mAcceptPauseTimer = nullptr;
+    if (server->mListenFd >= 0 && !server->mListenHandler)
+        server->mListenHandler =
+            ecore_main_fd_handler_add(server->mListenFd, ECORE_FD_READ, AcceptCb, server, nullptr, nullptr);
+    return ECORE_CALLBACK_CANCEL;
+}
+
+Eina_Bool ControlServer::ClientCb(void* data, Ecore_Fd_Handler* handler)
 {
     auto* client = static_cast<Client*>(data);
     if (!client || !client->server)
         return ECORE_CALLBACK_RENEW;
+    bool isReadable = ecore_main_fd_handler_active_get(handler, ECORE_FD_READ);
+    bool isWritable = ecore_main_fd_handler_active_get(handler, ECORE_FD_WRITE);
     try
     {
-        client->server->Read(client->id);
+        client->server->OnClientReady(client->id, isReadable, isWritable);
     }
     catch (...)
     {
@@ -138,42 +177,49 @@ ControlServer::Client* ControlServer::Find(unsigned clientId)
     return found == mClients.end() ? nullptr : found->second.get();
 }
 
+void ControlServer::OnClientReady(unsigned clientId, bool isReadable, bool isWritable)
+{
+    if (isWritable && !Flush(clientId))
+        return;
+    if (isReadable)
+        Read(clientId);
+    else
+        ProcessLines(clientId);
+}
+
 void ControlServer::Read(unsigned clientId)
 {
     Client* client = Find(clientId);
-    if (!client)
+    if (!client || client->isBusy || !client->output.empty() || client->isAtEnd)
         return;
-    char buffer[4096];
+    char buffer[kReadChunk];
     ssize_t got = read(client->fd, buffer, sizeof(buffer));
-    if (got < 0 && (errno == EINTR || errno == EAGAIN))
+    if (got < 0 && (errno == EINTR || errno == EAGAIN || errno == EWOULDBLOCK))
         return;
+    // The client has said all it will; answer what is buffered, then close.
     if (got <= 0)
-    {
-        // The client has said all it will; answer what is buffered, then close.
         client->isAtEnd = true;
-        ecore_main_fd_handler_del(client->handler);
-        client->handler = nullptr;
-    }
     else
         client->input.append(buffer, static_cast<size_t>(got));
     ProcessLines(clientId);
 }
 
+// Reads stop while a reply is pending or unsent, so a client's input is at
+// most one line and one read beyond it.
 void ControlServer::ProcessLines(unsigned clientId)
 {
     Client* client = Find(clientId);
-    while (client && !client->isBusy)
+    while (client && !client->isBusy && client->output.empty())
     {
         size_t end = client->input.find('\n');
         if (end == std::string::npos)
         {
             if (client->input.size() > kMaxLineLength)
-            {
-                WriteAll(client->fd, "ERR line too long\n");
-                Close(clientId);
-            }
+                Drop(clientId, "line too long");
             else if (client->isAtEnd)
                 Close(clientId);
+            else
+                UpdateInterest(*client);
             return;
         }
         std::string line = client->input.substr(0, end);
@@ -183,14 +229,18 @@ void ControlServer::ProcessLines(unsigned clientId)
         client->isBusy = true;
         client->isDispatching = true;
         std::weak_ptr<bool> alive = mAlive;
-        mHandler(line, [this, alive, clientId](const std::string& reply) {
-            if (auto token = alive.lock(); token && *token)
-                Reply(clientId, reply);
-        });
+        mHandler(line,
+                 [this, alive, clientId](const std::string& reply)
+                 {
+                     if (auto token = alive.lock(); token && *token)
+                         Reply(clientId, reply);
+                 });
         client = Find(clientId);
         if (client)
             client->isDispatching = false;
     }
+    if (client)
+        UpdateInterest(*client);
 }
 
 void ControlServer::Reply(unsigned clientId, const std::string& reply)
@@ -198,10 +248,75 @@ void ControlServer::Reply(unsigned clientId, const std::string& reply)
     Client* client = Find(clientId);
     if (!client || !client->isBusy)
         return;
-    WriteAll(client->fd, reply.empty() || reply.back() != '\n' ? reply + "\n" : reply);
     client->isBusy = false;
-    if (!client->isDispatching)
+    client->output += reply;
+    if (reply.empty() || reply.back() != '\n')
+        client->output += '\n';
+    if (!Flush(clientId))
+        return;
+    if (client->output.size() > kMaxPendingOutput)
+        Drop(clientId, "reply too large for a client that does not read");
+    else if (!client->isDispatching)
         ProcessLines(clientId);
+}
+
+bool ControlServer::Flush(unsigned clientId)
+{
+    Client* client = Find(clientId);
+    if (!client)
+        return false;
+    while (!client->output.empty())
+    {
+        ssize_t sent =
+            send(client->fd, client->output.data(), client->output.size(), MSG_NOSIGNAL | MSG_DONTWAIT);
+        if (sent > 0)
+            client->output.erase(0, static_cast<size_t>(sent));
+        else if (sent < 0 && errno == EINTR)
+            continue;
+        else if (sent < 0 && (errno == EAGAIN || errno == EWOULDBLOCK))
+            break;
+        else
+        {
+            Close(clientId);
+            return false;
+        }
+    }
+    UpdateInterest(*client);
+    return true;
+}
+
+// Waits for the socket to take output, or for the next command once the
+// last reply is out; for nothing while a reply is pending (a handler that
+// waited for nothing would still wake on a hang-up, again and again).
+void ControlServer::UpdateInterest(Client& client)
+{
+    int flags = 0;
+    if (!client.output.empty())
+        flags = ECORE_FD_WRITE;
+    else if (!client.isBusy && !client.isAtEnd)
+        flags = ECORE_FD_READ;
+    if (flags == 0)
+    {
+        if (client.handler)
+            ecore_main_fd_handler_del(client.handler);
+        client.handler = nullptr;
+    }
+    else if (client.handler)
+        ecore_main_fd_handler_active_set(client.handler, static_cast<Ecore_Fd_Handler_Flags>(flags));
+    else
+        client.handler = ecore_main_fd_handler_add(client.fd, static_cast<Ecore_Fd_Handler_Flags>(flags),
+                                                   ClientCb, &client, nullptr, nullptr);
+}
+
+void ControlServer::Drop(unsigned clientId, const std::string& why)
+{
+    Client* client = Find(clientId);
+    if (!client)
+        return;
+    mLimitLog.Log("control client " + std::to_string(clientId) + " disconnected: " + why);
+    std::string notice = "ERR " + why + "\n";
+    send(client->fd, notice.data(), notice.size(), MSG_NOSIGNAL | MSG_DONTWAIT);
+    Close(clientId);
 }
 
 void ControlServer::Close(unsigned clientId)

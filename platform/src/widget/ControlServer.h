@@ -8,13 +8,16 @@
 #include <memory>
 #include <string>
 
+#include "dlog/LogLimiter.h"
+
 namespace platform
 {
 
 // A Unix stream socket (mode 0600) that reads one command per line and
 // writes each reply before it reads the client's next command. Replies may
 // come later (from the main loop); a reply to a client that has gone is
-// dropped.
+// dropped. No client can stall the others: sockets are non-blocking, each
+// client's input and output are bounded, and so is the number of clients.
 class ControlServer
 {
 public:
@@ -32,6 +35,10 @@ public:
     void Stop();
 
     static const size_t kMaxLineLength = 65536;
+    // Replies not yet taken by a client; one reply never comes near it.
+    static const size_t kMaxPendingOutput = 8 * 1024 * 1024;
+    static const size_t kMaxClients = 64;
+    static const int kBacklog = 128;
 
 private:
     struct Client
@@ -41,6 +48,7 @@ private:
         int fd = -1;
         Ecore_Fd_Handler* handler = nullptr;
         std::string input;
+        std::string output;
         bool isBusy = false;
         bool isDispatching = false;
         bool isAtEnd = false;
@@ -48,10 +56,17 @@ private:
 
     static Eina_Bool AcceptCb(void* data, Ecore_Fd_Handler* handler);
     static Eina_Bool ClientCb(void* data, Ecore_Fd_Handler* handler);
+    static Eina_Bool ResumeAcceptCb(void* data);
     void Accept();
+    void PauseAccept();
+    void OnClientReady(unsigned clientId, bool isReadable, bool isWritable);
     void Read(unsigned clientId);
     void ProcessLines(unsigned clientId);
     void Reply(unsigned clientId, const std::string& reply);
+    // False when the client was closed.
+    bool Flush(unsigned clientId);
+    void UpdateInterest(Client& client);
+    void Drop(unsigned clientId, const std::string& why);
     void Close(unsigned clientId);
     Client* Find(unsigned clientId);
 
@@ -59,8 +74,10 @@ private:
     std::string mPath;
     int mListenFd = -1;
     Ecore_Fd_Handler* mListenHandler = nullptr;
+    Ecore_Timer* mAcceptPauseTimer = nullptr;
     std::map<unsigned, std::unique_ptr<Client>> mClients;
     unsigned mNextClientId = 1;
+    LogLimiter mLimitLog{DLOG_ERROR, "widget-host"};
     std::shared_ptr<bool> mAlive = std::make_shared<bool>(true);
 };
 

@@ -19,14 +19,14 @@ const char* WidgetInstanceStateName(WidgetInstanceState state)
 {
     switch (state)
     {
-    case WidgetInstanceState::Created:
-        return "created";
-    case WidgetInstanceState::Running:
-        return "running";
-    case WidgetInstanceState::Paused:
-        return "paused";
-    case WidgetInstanceState::Destroyed:
-        return "destroyed";
+        case WidgetInstanceState::Created:
+            return "created";
+        case WidgetInstanceState::Running:
+            return "running";
+        case WidgetInstanceState::Paused:
+            return "paused";
+        case WidgetInstanceState::Destroyed:
+            return "destroyed";
     }
     return "unknown";
 }
@@ -121,6 +121,7 @@ Evas_Object* WidgetInstance::CreateWindow(const char* name)
     if (engine && strcmp(engine, "buffer") == 0)
         elm_win_borderless_set(mWindow, EINA_TRUE);
     evas_object_resize(mWindow, mWidth, mHeight);
+    evas_object_intercept_resize_callback_add(mWindow, WindowResizeCb, nullptr);
     evas_object_event_callback_add(mWindow, EVAS_CALLBACK_DEL, WindowDelCb, this);
     evas_object_smart_callback_add(mWindow, "delete,request", CloseRequestCb, this);
     return mWindow;
@@ -129,6 +130,16 @@ Evas_Object* WidgetInstance::CreateWindow(const char* name)
 Evas* WidgetInstance::GetWindowCanvas() const
 {
     return mWindow ? evas_object_evas_get(mWindow) : nullptr;
+}
+
+// The buffer engine frees the window's pixels on a resize while the render
+// thread may still be drawing the last frame into them; wait for it first.
+void WidgetInstance::WindowResizeCb(void*, Evas_Object* window, Evas_Coord width, Evas_Coord height)
+{
+    if (!window)
+        return;
+    evas_sync(evas_object_evas_get(window));
+    evas_object_resize(window, width, height);
 }
 
 void WidgetInstance::WindowDelCb(void* data, Evas*, Evas_Object*, void*)

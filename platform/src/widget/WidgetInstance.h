@@ -71,6 +71,7 @@ public:
     Evas* GetWindowCanvas() const;
 
 private:
+    static void WindowResizeCb(void* data, Evas_Object* window, Evas_Coord width, Evas_Coord height);
     static void WindowDelCb(void* data, Evas* evas, Evas_Object* obj, void* eventInfo);
     static void ParentDelCb(void* data, Evas* evas, Evas_Object* obj, void* eventInfo);
     static void CloseRequestCb(void* data, Evas_Object* obj, void* eventInfo);

@@ -90,6 +90,13 @@ struct Binary
         return b;
     }
     std::string Base64() const { return platform::Base64Encode(data); }
+    // `count` entries with distinct keys, the last one named `lastKey`.
+    static Binary Many(size_t count, const std::string& lastKey)
+    {
+        Binary b = Header(static_cast<uint32_t>(count));
+        for (size_t i = 0; i + 1 < count; ++i) b.Entry("k" + std::to_string(i), "v");
+        return b.Entry(lastKey, "v");
+    }
 };
 
 class BundleTest : public WeatherTest::PlatformTest
@@ -205,6 +212,8 @@ TEST_F(BundleTest, DecodeRejectsMalformedEncodings)
         {"NUL in value", Binary::Header(1).Entry("a", std::string("1\0", 2)).Base64()},
         {"unknown type", Binary::Header(1).U32(BUNDLE_TYPE_BYTE).Text("a").Text("1").Base64()},
         {"length beyond data", Binary::Header(1).U32(BUNDLE_TYPE_STR).U32(0x7FFFFFFF).Raw("a").Base64()},
+        {"more entries than the cap", Binary::Many(platform::kMaxBundleEntries + 1, "last").Base64()},
+        {"duplicate of the first key, last", Binary::Many(platform::kMaxBundleEntries, "k0").Base64()},
     };
     for (const auto& item : cases)
     {
@@ -214,6 +223,14 @@ TEST_F(BundleTest, DecodeRejectsMalformedEncodings)
         EXPECT_TRUE(mLog.Contains("rejected a malformed encoding", "BUNDLE")) << item.first;
     }
     EXPECT_TRUE(Decode(Binary::Header(1).Entry("a", "1").Base64()));
+    BundlePtr full = Decode(Binary::Many(platform::kMaxBundleEntries, "last").Base64());
+    ASSERT_TRUE(full);
+    // What the decoder would refuse is not encoded either.
+    bundle_add_str(full.get(), "one more", "v");
+    bundle_raw* raw = nullptr;
+    int length = 0;
+    EXPECT_EQ(BUNDLE_ERROR_INVALID_PARAMETER, bundle_encode(full.get(), &raw, &length));
+    EXPECT_EQ(nullptr, raw);
     EXPECT_EQ(nullptr, bundle_decode(nullptr, 4));
     EXPECT_EQ(nullptr, bundle_decode(reinterpret_cast<const bundle_raw*>("QUJD"), 0));
 }

@@ -18,15 +18,25 @@ const char* const WidgetHostTest::kWidgetId = "com.quorvex.test-widget";
 namespace
 {
 const double kStartSeconds = 20.0;
+
+// Ecore blocks SIGTERM and others in this process; a child keeps that mask
+// across exec, and an X server or window manager would never see the TERM.
+// Ecore's handlers go first, so that nothing pending reaches its pipe.
+void UnblockSignals()
+{
+    for (int signal = 1; signal < NSIG; ++signal) std::signal(signal, SIG_DFL);
+    sigset_t none;
+    sigemptyset(&none);
+    sigprocmask(SIG_SETMASK, &none, nullptr);
 }
+}  // namespace
 
 std::vector<std::string> Words(const std::string& line)
 {
     std::vector<std::string> words;
     std::istringstream stream(line);
     std::string word;
-    while (stream >> word)
-        words.push_back(word);
+    while (stream >> word) words.push_back(word);
     return words;
 }
 
@@ -45,6 +55,7 @@ pid_t WidgetHostTest::Spawn(const std::vector<std::string>& args, const std::str
     pid_t pid = fork();
     if (pid == 0)
     {
+        UnblockSignals();
         // EFL helpers keep inherited pipes open after exit: write to a file.
         int fd = open(output.c_str(), O_WRONLY | O_CREAT | O_APPEND, 0600);
         dup2(fd, 1);
@@ -56,8 +67,7 @@ pid_t WidgetHostTest::Spawn(const std::vector<std::string>& args, const std::str
             setenv("DISPLAY", display.c_str(), 1);
         setenv("TEST_WIDGET_RECORD", record.c_str(), 1);
         std::vector<char*> argv;
-        for (auto& arg : all)
-            argv.push_back(const_cast<char*>(arg.c_str()));
+        for (auto& arg : all) argv.push_back(const_cast<char*>(arg.c_str()));
         argv.push_back(nullptr);
         execv(argv[0], argv.data());
         _exit(127);
@@ -75,6 +85,7 @@ std::string WidgetHostTest::StartXServer()
     mXServerPid = fork();
     if (mXServerPid == 0)
     {
+        UnblockSignals();
         close(fds[0]);
         int out = open("/dev/null", O_WRONLY);
         dup2(out, 1);
@@ -88,8 +99,7 @@ std::string WidgetHostTest::StartXServer()
     // The server writes its display number once it accepts clients.
     std::string number;
     char c = 0;
-    while (read(fds[0], &c, 1) == 1 && c != '\n')
-        number += c;
+    while (read(fds[0], &c, 1) == 1 && c != '\n') number += c;
     close(fds[0]);
     if (number.empty())
         return std::string();
@@ -98,6 +108,7 @@ std::string WidgetHostTest::StartXServer()
     mWindowManagerPid = fork();
     if (mWindowManagerPid == 0)
     {
+        UnblockSignals();
         int out = open("/dev/null", O_WRONLY);
         dup2(out, 1);
         dup2(out, 2);
@@ -155,6 +166,8 @@ int WidgetHostTest::WaitForExit(double seconds)
         if (waitpid(mHostPid, &status, WNOHANG) == mHostPid)
         {
             mHostPid = -1;
+            if (WIFSIGNALED(status))
+                ADD_FAILURE() << "the host died of signal " << WTERMSIG(status);
             return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
         }
         std::this_thread::sleep_for(std::chrono::milliseconds(20));

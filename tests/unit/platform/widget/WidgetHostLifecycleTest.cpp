@@ -50,8 +50,9 @@ TEST_F(WidgetHostTest, InstancesFromTheCommandLineAndTheSocketLiveSideBySide)
     auto lines = Words(list);
     ASSERT_EQ(lines.size(), 2u + 3u * 5u) << list;
     EXPECT_EQ(lines[1], "3");
-    EXPECT_THAT(Records("create"), ElementsAre(HasSubstr(" 712 354 type=0x10"), HasSubstr(" 712 712 type=0x40"),
-                                               "create " + third + " 712 712 type=0x40 content=no"));
+    EXPECT_THAT(Records("create"),
+                ElementsAre(HasSubstr(" 712 354 type=0x10"), HasSubstr(" 712 712 type=0x40"),
+                            "create " + third + " 712 712 type=0x40 content=no"));
     // Ids are unique texts.
     auto creates = Records("create");
     EXPECT_NE(Words(creates[0])[1], Words(creates[1])[1]);
@@ -109,10 +110,22 @@ TEST_F(WidgetHostTest, PauseAndResumeFollowTheStateAndHoldBackUnforcedUpdates)
     EXPECT_EQ(Send("resize " + id + " 4x4"), "OK");
     EXPECT_THAT(CallbacksOf(Records(), id),
                 ElementsAre("create", "resize", "resume", "pause", "resume", "update", "update", "resize"));
-    EXPECT_THAT(Records("update"), ElementsAre("update " + id + " force=0 reason=-",
-                                               "update " + id + " force=1 reason=-"));
+    EXPECT_THAT(Records("update"),
+                ElementsAre("update " + id + " force=0 reason=-", "update " + id + " force=1 reason=-"));
     EXPECT_THAT(Records("resize").back(), "resize " + id + " 712 712");
     EXPECT_EQ(Send("list"), "OK 1\n" + id + "\t4x4\tTest 1\trunning");
+}
+
+// The buffer engine frees a window's pixels on a resize; a frame still being
+// drawn into them crashed the host now and then.
+TEST_F(WidgetHostTest, ResizingWhileTheWidgetDrawsKeepsTheHostAlive)
+{
+    StartHost();
+    std::string id = CreateInstance("4x2");
+    ASSERT_EQ(Send("tap " + id + " 300 300").compare(0, 3, "OK "), 0);
+    for (int i = 0; i < 40; ++i)
+        ASSERT_EQ(Send("resize " + id + (i % 2 ? " 4x2" : " 4x4")), "OK") << "resize " << i;
+    EXPECT_EQ(Send("list"), "OK 1\n" + id + "\t4x2\tTest 1\trunning");
 }
 
 TEST_F(WidgetHostTest, LanguageKeyUpdatesLanguageAndTriggerUpdateReachesEveryInstance)
@@ -183,10 +196,11 @@ TEST_F(WidgetHostTest, WidgetCanWalkItsContextsAndEndOneOfThem)
     std::string second = CreateInstance("4x4");
     EXPECT_EQ(Send("event low-memory"), "OK");
     WaitIdle();
-    EXPECT_THAT(Records("contexts"), ElementsAre("contexts " + first + " " + second + " all=0 stopped=" +
-                                                 std::to_string(WIDGET_ERROR_CANCELED)));
+    EXPECT_THAT(Records("contexts"), ElementsAre("contexts " + first + " " + second +
+                                                 " all=0 stopped=" + std::to_string(WIDGET_ERROR_CANCELED)));
     EXPECT_THAT(Records("terminate"), ElementsAre("terminate " + first + " 0"));
-    EXPECT_THAT(CallbacksOf(Records(), first), ElementsAre("create", "resize", "resume", "contexts", "terminate", "pause", "destroy"));
+    EXPECT_THAT(CallbacksOf(Records(), first),
+                ElementsAre("create", "resize", "resume", "contexts", "terminate", "pause", "destroy"));
     EXPECT_THAT(Records("destroy"), ElementsAre("destroy " + first + " reason=0 content=yes tag=kept"));
     EXPECT_EQ(Send("list"), "OK 1\n" + second + "\t4x4\tTest 2\trunning");
 }
@@ -211,9 +225,10 @@ TEST_F(WidgetHostTest, LowBatteryEndsTheProcessAfterDestroyingItsInstances)
     EXPECT_EQ(WaitForExit(10.0), 0);
     auto records = Records();
     ASSERT_GE(records.size(), 4u);
-    EXPECT_THAT(std::vector<std::string>(records.end() - 5, records.end()),
-                ElementsAre("event low-battery 2", "pause " + id, "destroy " + id + " reason=5 content=yes tag=kept",
-                            "app-terminate", "main-returned 0"));
+    EXPECT_THAT(
+        std::vector<std::string>(records.end() - 5, records.end()),
+        ElementsAre("event low-battery 2", "pause " + id, "destroy " + id + " reason=5 content=yes tag=kept",
+                    "app-terminate", "main-returned 0"));
     struct stat info;
     EXPECT_NE(stat(SocketPath().c_str(), &info), 0) << "the socket outlived its host";
 }
@@ -228,17 +243,18 @@ TEST_F(WidgetHostTest, ControlSocketIsPrivateAndASecondHostIsRefused)
     pid_t second = Spawn({}, "second.out");
     int status = 0;
     ASSERT_EQ(waitpid(second, &status, 0), second);
-    EXPECT_EQ(Records("main-returned"), std::vector<std::string>{"main-returned " +
-                                                                 std::to_string(WIDGET_ERROR_ALREADY_STARTED)});
+    EXPECT_EQ(Records("main-returned"),
+              std::vector<std::string>{"main-returned " + std::to_string(WIDGET_ERROR_ALREADY_STARTED)});
     EXPECT_EQ(Send("list"), "OK 0");
 }
 
 TEST_F(WidgetHostTest, WidgetctlExitCodesTellOkErrAndNoHost)
 {
     StartHost();
-    auto run = [this](const std::string& args) {
-        std::string command = std::string(WIDGETCTL_PROGRAM) + " --widget-id " + args + " > " +
-                              mRoot.Path("ctl.out") + " 2>&1";
+    auto run = [this](const std::string& args)
+    {
+        std::string command =
+            std::string(WIDGETCTL_PROGRAM) + " --widget-id " + args + " > " + mRoot.Path("ctl.out") + " 2>&1";
         int status = system(command.c_str());
         return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
     };
