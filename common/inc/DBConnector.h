@@ -10,7 +10,8 @@ namespace NSWeather
 
 // The one SQLite connection of the process. Every database operation is a
 // short cycle: DBInitialize (open + begin), statements, DBFinalize (commit
-// + close). Cycles never nest; at most one file is open at a time.
+// + close). Cycles never nest; at most one file is open at a time. A cycle
+// in which a step failed is rolled back instead of committed.
 class DBConnector
 {
 public:
@@ -19,7 +20,14 @@ public:
     virtual ~DBConnector();
 
     bool DBInitialize(const std::string& dbFilePath, bool isReadOnly);
-    void DBFinalize();
+    // A write cycle that holds the write lock from its first read on, so no
+    // other process writes between what it reads and what it writes back.
+    bool DBInitializeImmediate(const std::string& dbFilePath);
+    // Commits (or rolls back a failed cycle) and closes; true only when a
+    // cycle without failure was committed.
+    bool DBFinalize();
+    void MarkCycleFailed() { mIsCycleFailed = true; }
+    bool GetIsCycleFailed() const { return mIsCycleFailed; }
     // The caller owns the statement and finalises it (see DBStatement).
     sqlite3_stmt* DBPrepareQuery(const char* query);
     bool DBExecuteQuery(const char* query);
@@ -35,11 +43,13 @@ private:
     bool DBFileOpen(const std::string& dbFilePath, int openFlags);
     bool DBSetBusyHandler();
     bool DBExcutePerformanceOptimization();
-    bool DBStartTransaction();
+    bool DBOpen(const std::string& dbFilePath, int openFlags, const char* beginQuery);
+    bool DBStartTransaction(const char* beginQuery);
     bool DBEndTransaction();
     void DBClose();
 
     sqlite3* mDBHandle;
+    bool mIsCycleFailed;
 };
 
 }  // namespace NSWeather

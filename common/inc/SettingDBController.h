@@ -1,6 +1,7 @@
 #ifndef NSWEATHER_SETTING_DB_CONTROLLER_H
 #define NSWEATHER_SETTING_DB_CONTROLLER_H
 
+#include <functional>
 #include <string>
 
 #include "QueryGenernator.h"
@@ -31,6 +32,12 @@ public:
     void UpdateLocationIdOfDisplayCity(const std::string& locationId);
     // Null when there is no row or the database cannot be read.
     SettingPtr Select();
+    // Reads the row, lets `change` edit it and writes it back whole, in one
+    // write transaction taken before the read (BEGIN IMMEDIATE), so a write by
+    // another process in between is never undone. Returns the record as
+    // written, or null (nothing written, logged) when there is no row or any
+    // step fails.
+    SettingPtr SelectAndUpdate(const std::function<void(const SettingPtr&)>& change);
     // The settings row has had the same columns in every version.
     void UpgradeDB(double currentVersion);
 
@@ -38,6 +45,7 @@ private:
     static void BindSetting(DBStatement& statement, const SettingPtr& settingPtr);
     static SettingPtr ReadSetting(const DBStatement& statement);
     SettingPtr SelectRow();
+    bool UpdateRow(const SettingPtr& settingPtr);
 
     QueryGenernator mQueryGenernator;
 };

@@ -21,9 +21,7 @@ DBConnector* DBConnector::GetInstance()
     return instance;
 }
 
-DBConnector::DBConnector() : mDBHandle(nullptr)
-{
-}
+DBConnector::DBConnector() : mDBHandle(nullptr), mIsCycleFailed(false) {}
 
 DBConnector::~DBConnector()
 {
@@ -32,32 +30,44 @@ DBConnector::~DBConnector()
 
 bool DBConnector::DBInitialize(const std::string& dbFilePath, bool isReadOnly)
 {
+    if (isReadOnly)
+        return DBOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY, "BEGIN TRANSACTION;");
+    return DBOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE,
+                  "BEGIN TRANSACTION;");
+}
+
+bool DBConnector::DBInitializeImmediate(const std::string& dbFilePath)
+{
+    return DBOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE,
+                  "BEGIN IMMEDIATE TRANSACTION;");
+}
+
+bool DBConnector::DBOpen(const std::string& dbFilePath, int openFlags, const char* beginQuery)
+{
     if (mDBHandle)
     {
         COMMON_LOG("DBInitialize is already called, mDBHandle is not NULL");
         return true;
     }
     COMMON_RETV_IF(dbFilePath.empty(), false);
-    if (isReadOnly)
-        COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY) == false, false);
-    else
-        COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE) == false,
-                       false);
+    COMMON_RETV_IF(DBFileOpen(dbFilePath, openFlags) == false, false);
     COMMON_RETV_IF(DBSetBusyHandler() == false, false);
     COMMON_RETV_IF(DBExcutePerformanceOptimization() == false, false);
-    COMMON_RETV_IF(DBStartTransaction() == false, false);
+    COMMON_RETV_IF(DBStartTransaction(beginQuery) == false, false);
+    mIsCycleFailed = false;
     return true;
 }
 
-void DBConnector::DBFinalize()
+bool DBConnector::DBFinalize()
 {
-    COMMON_RET_IF(DBEndTransaction() == false);
     if (!mDBHandle)
     {
         COMMON_LOG("mDBHandle is NULL");
-        return;
+        return false;
     }
+    bool isCommitted = DBEndTransaction();
     DBClose();
+    return isCommitted;
 }
 
 sqlite3_stmt* DBConnector::DBPrepareQuery(const char* query)
@@ -118,7 +128,8 @@ bool DBConnector::DBFileOpen(const std::string& dbFilePath, int openFlags)
     int rc = sqlite3_open_v2(dbFilePath.c_str(), &mDBHandle, openFlags, nullptr);
     if (rc != SQLITE_OK)
     {
-        COMMON_LOG("sqlite3_open_open failed. %d %p, %s", rc, static_cast<void*>(mDBHandle), dbFilePath.c_str());
+        COMMON_LOG("sqlite3_open_open failed. %d %p, %s", rc, static_cast<void*>(mDBHandle),
+                   dbFilePath.c_str());
         DBClose();
         return false;
     }
@@ -141,8 +152,9 @@ bool DBConnector::DBSetBusyHandler()
 bool DBConnector::DBExcutePerformanceOptimization()
 {
     char* errorMsg = nullptr;
-    int rc = sqlite3_exec(mDBHandle, "PRAGMA synchronous=OFF; PRAGMA count_changes=OFF; PRAGMA temp_store=memory;",
-                          nullptr, nullptr, &errorMsg);
+    int rc =
+        sqlite3_exec(mDBHandle, "PRAGMA synchronous=OFF; PRAGMA count_changes=OFF; PRAGMA temp_store=memory;",
+                     nullptr, nullptr, &errorMsg);
     if (rc != SQLITE_OK)
     {
         COMMON_LOG("Fail to sqlite3_exec for performance optimization.");
@@ -154,28 +166,34 @@ bool DBConnector::DBExcutePerformanceOptimization()
     return true;
 }
 
-bool DBConnector::DBStartTransaction()
+bool DBConnector::DBStartTransaction(const char* beginQuery)
 {
-    if (sqlite3_exec(mDBHandle, "BEGIN TRANSACTION;", nullptr, nullptr, nullptr) != SQLITE_OK)
+    int rc = sqlite3_exec(mDBHandle, beginQuery, nullptr, nullptr, nullptr);
+    if (rc != SQLITE_OK)
     {
-        COMMON_LOG("sqlite3_exec fail");
+        COMMON_LOG("Fail: %s rc [%d][%s]", beginQuery, rc, sqlite3_errmsg(mDBHandle));
         DBClose();
         return false;
     }
     return true;
 }
 
-// A commit that fails (e.g. busy) is rolled back so that the handle is not
-// left open inside a transaction for the next cycle to inherit.
+// A cycle with a failed step, or whose commit fails (e.g. busy), is rolled
+// back: nothing of it is kept and the handle does not stay inside a
+// transaction for the next cycle to inherit.
 bool DBConnector::DBEndTransaction()
 {
-    if (!mDBHandle)
-        return true;
-    if (sqlite3_exec(mDBHandle, "END TRANSACTION;", nullptr, nullptr, nullptr) != SQLITE_OK)
+    if (mIsCycleFailed)
     {
-        COMMON_LOG("sqlite3_exec fail");
+        COMMON_LOG("A step of this cycle failed: rolled back");
         sqlite3_exec(mDBHandle, "ROLLBACK;", nullptr, nullptr, nullptr);
-        DBClose();
+        return false;
+    }
+    int rc = sqlite3_exec(mDBHandle, "END TRANSACTION;", nullptr, nullptr, nullptr);
+    if (rc != SQLITE_OK)
+    {
+        COMMON_LOG("Fail: END TRANSACTION rc [%d][%s]", rc, sqlite3_errmsg(mDBHandle));
+        sqlite3_exec(mDBHandle, "ROLLBACK;", nullptr, nullptr, nullptr);
         return false;
     }
     return true;

@@ -9,7 +9,22 @@ DBCycleCloser::DBCycleCloser(DBConnector* dbConnector) : mDBConnector(dbConnecto
 
 DBCycleCloser::~DBCycleCloser()
 {
-    mDBConnector->DBFinalize();
+    Close();
+}
+
+void DBCycleCloser::MarkFailed()
+{
+    if (mDBConnector)
+        mDBConnector->MarkCycleFailed();
+}
+
+bool DBCycleCloser::Close()
+{
+    if (!mDBConnector)
+        return false;
+    bool isCommitted = mDBConnector->DBFinalize();
+    mDBConnector = nullptr;
+    return isCommitted;
 }
 
 }  // namespace NSWeather

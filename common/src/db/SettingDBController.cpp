@@ -127,7 +127,28 @@ SettingPtr SettingDBController::Select()
     return SelectRow();
 }
 
+SettingPtr SettingDBController::SelectAndUpdate(const std::function<void(const SettingPtr&)>& change)
+{
+    COMMON_RETV_IF(!change, nullptr);
+    DBConnector* dbConnector = DBConnector::GetInstance();
+    COMMON_RETV_IF(dbConnector->DBInitializeImmediate(GetSettingDBFilePath()) == false, nullptr);
+    DBCycleCloser cycle(dbConnector);
+    SettingPtr settingPtr = SelectRow();
+    COMMON_RETV_IF(!settingPtr, nullptr);
+    change(settingPtr);
+    COMMON_RETV_IF(UpdateRow(settingPtr) == false, nullptr);
+    COMMON_RETV_IF(cycle.Close() == false, nullptr);
+    return settingPtr;
+}
+
 void SettingDBController::UpgradeDB(double /*currentVersion*/) {}
+
+bool SettingDBController::UpdateRow(const SettingPtr& settingPtr)
+{
+    DBStatement statement(mQueryGenernator.MakeUpdateQuery(SETTING_TABLE, SETTING_ASSIGNMENTS));
+    BindSetting(statement, settingPtr);
+    return statement.Execute();
+}
 
 SettingPtr SettingDBController::SelectRow()
 {
