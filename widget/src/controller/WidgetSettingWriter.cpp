@@ -10,11 +10,9 @@ NSWeather::SettingPtr WidgetSettingWriter::Change(
     const std::function<void(const NSWeather::SettingPtr&)>& change)
 {
     NSWeather::SettingDBController settingDBController;
-    NSWeather::SettingPtr settingPtr = settingDBController.Select();
-    WIDGET_RETV_IF(!settingPtr, nullptr);
-    change(settingPtr);
-    settingDBController.Update(settingPtr);
-    return settingPtr;
+    NSWeather::SettingPtr written = settingDBController.SelectAndUpdate(change);
+    WIDGET_RETV_IF(!written, nullptr);
+    return written;
 }
 
 }  // namespace NSWeatherWidget

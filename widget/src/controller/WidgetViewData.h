@@ -17,7 +17,7 @@ namespace NSWeatherWidget
 class WidgetViewData
 {
 public:
-    static const int kSizeTypeUnknown = 0xFFFF;
+    static constexpr int kSizeTypeUnknown = 0xFFFF;
 
     WidgetViewData();
     ~WidgetViewData() = default;

@@ -11,7 +11,7 @@ namespace NSWeatherWidget
 class Widget4x4Page : public Widget4x2Page
 {
 public:
-    static const int kForecastDays = 4;
+    static constexpr int kForecastDays = 4;
 
     Widget4x4Page() = default;
     ~Widget4x4Page() override = default;

@@ -20,8 +20,8 @@ class WidgetTouchController
 {
 public:
     // Taps stay within this many units and last less than this long.
-    static const int kTapDistance = 19;
-    static const unsigned int kTapDuration = 500;
+    static constexpr int kTapDistance = 19;
+    static constexpr unsigned int kTapDuration = 500;
 
     WidgetTouchController() = default;
     virtual ~WidgetTouchController();

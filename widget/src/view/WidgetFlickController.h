@@ -19,7 +19,7 @@ namespace NSWeatherWidget
 class WidgetFlickController
 {
 public:
-    static const unsigned int kFlickDuration = 500;
+    static constexpr unsigned int kFlickDuration = 500;
     static constexpr double kSlideSeconds = 1.0;
     enum Direction
     {

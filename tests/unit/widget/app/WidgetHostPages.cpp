@@ -52,8 +52,9 @@ void WidgetHostPagesTest::TearDown()
 
 void WidgetHostPagesTest::WriteCities(int count, int days, bool firstIsCurrentLocation)
 {
-    ASSERT_EQ(NSWeatherWidget::SampleCities::WriteCities(count, time(nullptr) - 600, days, firstIsCurrentLocation),
-              NSWeather::ERR_OK);
+    ASSERT_EQ(
+        NSWeatherWidget::SampleCities::WriteCities(count, time(nullptr) - 600, days, firstIsCurrentLocation),
+        NSWeather::ERR_OK);
 }
 
 void WidgetHostPagesTest::ChangeSetting(const std::function<void(const NSWeather::SettingPtr&)>& change)
@@ -94,8 +95,7 @@ void WidgetHostPagesTest::StartHost(const std::vector<std::string>& sizes)
         unsetenv("WAYLAND_DISPLAY");
         setenv("PLATFORM_APP_ID", kWidgetId, 1);
         std::vector<char*> argv;
-        for (auto& arg : args)
-            argv.push_back(const_cast<char*>(arg.c_str()));
+        for (auto& arg : args) argv.push_back(const_cast<char*>(arg.c_str()));
         argv.push_back(nullptr);
         execv(argv[0], argv.data());
         _exit(127);
