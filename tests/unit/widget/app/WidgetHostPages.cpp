@@ -142,6 +142,17 @@ std::string WidgetHostPagesTest::Slot(const std::string& id, const std::string& 
     return std::string();
 }
 
+std::string WidgetHostPagesTest::CentreText(const std::string& id, const std::string& part)
+{
+    std::string centre = Slot(id, "centerLayout");
+    std::string key = "\"" + part + "\":\"";
+    size_t at = centre.find(key);
+    if (at == std::string::npos)
+        return std::string();
+    at += key.size();
+    return centre.substr(at, centre.find('"', at) - at);
+}
+
 std::vector<std::string> WidgetHostPagesTest::Launches() const
 {
     return ReadLines(mRoot.Path("log/launch.log"));

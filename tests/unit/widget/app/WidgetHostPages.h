@@ -18,7 +18,7 @@ namespace WeatherTest
 // database files and system keys, driven through the control socket.
 class WidgetHostPagesTest : public PlatformTest
 {
-protected:
+public:
     static const char* const kWidgetId;
 
     void SetUp() override;
@@ -36,6 +36,8 @@ protected:
     void WaitIdle();
     // The JSON of one page slot ("centerLayout" ...) of an instance's dump.
     std::string Slot(const std::string& id, const std::string& slot);
+    // The text of `part` in the centre page of an instance ("" if none).
+    std::string CentreText(const std::string& id, const std::string& part);
     std::vector<std::string> Launches() const;
     // Lines of the widget process's log that contain `text`.
     int CountLog(const std::string& text) const;
