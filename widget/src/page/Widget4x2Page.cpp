@@ -365,6 +365,14 @@ Evas_Object* Widget4x2Page::CreateActivityIndicator(Evas_Object* parent)
     Evas_Object* indicator = helper.CreateActivityIndicator(parent, "process_small");
     if (!indicator)
         return nullptr;
+    // Desktop themes have no small process style; their wheel is the same
+    // spinning circle.
+    if (!elm_theme_group_path_find(nullptr, "elm/progressbar/horizontal/process_small"))
+    {
+        const double kWheelScale = 0.6;  // fits the refresh button's square
+        elm_object_style_set(indicator, "wheel");
+        elm_object_scale_set(indicator, kWheelScale);
+    }
     uxt_theme_object_replace_color(indicator, "W157E1", "AO803E1");
     uxt_theme_object_replace_color(indicator, "W157E2", "AO803E2");
     uxt_theme_object_replace_color(indicator, "W157E3", "AO803E3");
