@@ -48,6 +48,11 @@ void WidgetHostPagesTest::TearDown()
         waitpid(mHostPid, nullptr, 0);
         ADD_FAILURE() << "the widget did not end on exit";
     }
+    // Under the sanitizers a fault in the widget shows in its output only.
+    std::string output = ReadText(mRoot.Path("host.out"));
+    EXPECT_EQ(output.find("ERROR: AddressSanitizer"), std::string::npos) << output;
+    EXPECT_EQ(output.find("runtime error:"), std::string::npos) << output;
+    unlink(mRoot.Path("host.out").c_str());
 }
 
 void WidgetHostPagesTest::WriteCities(int count, int days, bool firstIsCurrentLocation)
