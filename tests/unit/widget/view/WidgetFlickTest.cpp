@@ -99,3 +99,20 @@ TEST_F(WidgetFlickTest, SwipesDuringASlideAreIgnoredInEveryInstance)
 }
 
 }  // namespace WeatherTest
+
+namespace WeatherTest
+{
+
+// The slide's transit, its job and the process-wide lock die with the
+// instance; the other instance can flick at once.
+TEST_F(WidgetFlickTest, InstanceDestroyedDuringASlideReleasesTheLock)
+{
+    Start(3, 0, 2);
+    Swipe(1, -150);
+    EXPECT_EQ(Send("destroy " + Id(1)), "OK");
+    Swipe(2, -150);
+    WaitIdle();
+    EXPECT_EQ(CentreText(Id(2), "name"), kNames[1]);
+}
+
+}  // namespace WeatherTest
