@@ -42,7 +42,8 @@ void MakeRoot()
     NSWeather::FileUtil::ClearCache();
     vconf_set_int("memory/dnet/status", 2);
     vconf_set_int("db/location/setting/Usemylocation", 1);
-    if (NSWeather::DataStoreInitializer::Run() != 0 || SampleCities::WriteCities(3, time(nullptr), 7, false) != 0)
+    if (NSWeather::DataStoreInitializer::Run() != 0 ||
+        SampleCities::WriteCities(3, time(nullptr), 7, false) != 0)
         abort();
 }
 
@@ -77,8 +78,7 @@ void Rebuild(benchmark::State& state, int h)
     for (auto _ : state)
     {
         widgetMain->LoadAllWeatherInformation();
-        for (int i = 0; i < 3; ++i)
-            pages[i]->Resume(i);
+        for (int i = 0; i < 3; ++i) pages[i]->Resume(i);
         canvas.Render();
     }
 }
@@ -100,8 +100,14 @@ void BM_EdjeLoad4x4Page(benchmark::State& state)
 {
     Canvas canvas(712, 712);
     std::string file = std::string(WEATHER_BENCH_RES_DIR) + "/widget/Widget4x4Page.edj";
-    const char* groups[] = {"widgetPage", "city", "cityName", "iconAndTemperature", "weatherForecast",
-                            "bottomLine", "BottomLinePressEffect", "BottomLinePressEffect"};
+    const char* groups[] = {"widgetPage",
+                            "city",
+                            "cityName",
+                            "iconAndTemperature",
+                            "weatherForecast",
+                            "bottomLine",
+                            "BottomLinePressEffect",
+                            "BottomLinePressEffect"};
     for (auto _ : state)
     {
         for (const char* group : groups)
@@ -149,8 +155,7 @@ BENCHMARK(BM_TextFormatting4x4Page)->Unit(benchmark::kMicrosecond);
 // The reads of one update: the settings row and every city.
 void BM_DatabaseReads(benchmark::State& state)
 {
-    for (auto _ : state)
-        WidgetMain::GetInstance()->LoadAllWeatherInformation();
+    for (auto _ : state) WidgetMain::GetInstance()->LoadAllWeatherInformation();
 }
 BENCHMARK(BM_DatabaseReads)->Unit(benchmark::kMicrosecond);
 }  // namespace

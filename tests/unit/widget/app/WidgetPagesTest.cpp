@@ -79,7 +79,7 @@ const PageCase kPageCases[] = {
      0,
      7,
      false,
-     [](WidgetHostPagesTest& t) { static_cast<WidgetPageStatesTest&>(t).ChangeSettingOf(Refreshing); },
+     [](WidgetHostPagesTest& t) { t.ChangeSetting(Refreshing); },
      {"\"group\":\"loading\"", "\"message\":\"Loading…\""},
      {"\"group\":\"noCity\""}},
     {"City4x2",
@@ -98,10 +98,7 @@ const PageCase kPageCases[] = {
      7,
      false,
      [](WidgetHostPagesTest& t)
-     {
-         static_cast<WidgetPageStatesTest&>(t).ChangeSettingOf([](const NSWeather::SettingPtr& s)
-                                                               { s->SetTemperatureUnit(0); });
-     },
+     { t.ChangeSetting([](const NSWeather::SettingPtr& s) { s->SetTemperatureUnit(0); }); },
      {"\"current\":\"56\"", "_196x196.png", "weather_widget_4x4_temp_f.png",
       "\"weatherForecastHighTemp4\":\"56°\"", "\"weatherForecastLowTemp1\":\"47°\"", "_96x96.png"},
      {}},
@@ -120,7 +117,7 @@ const PageCase kPageCases[] = {
      1,
      7,
      false,
-     [](WidgetHostPagesTest& t) { static_cast<WidgetPageStatesTest&>(t).SetKeyOf("memory/dnet/status", 0); },
+     [](WidgetHostPagesTest& t) { t.SetKey("memory/dnet/status", 0); },
      {"\"msg\":\"No network connection\"", "\"date\":\"\""},
      {}},
     {"LocationOffOnCurrentLocationCity",
@@ -130,8 +127,8 @@ const PageCase kPageCases[] = {
      true,
      [](WidgetHostPagesTest& t)
      {
-         static_cast<WidgetPageStatesTest&>(t).SetKeyOf("db/location/setting/Usemylocation", 0);
-         static_cast<WidgetPageStatesTest&>(t).SetKeyOf("db/location/setting/GpsEnabled", 0);
+         t.SetKey("db/location/setting/Usemylocation", 0);
+         t.SetKey("db/location/setting/GpsEnabled", 0);
      },
      {"\"msg\":\"Couldn't find location\"", "\"time\":\"\""},
      {}},
@@ -141,10 +138,7 @@ const PageCase kPageCases[] = {
      7,
      false,
      [](WidgetHostPagesTest& t)
-     {
-         static_cast<WidgetPageStatesTest&>(t).ChangeSettingOf([](const NSWeather::SettingPtr& s)
-                                                               { s->SetCpType("WeatherNews"); });
-     },
+     { t.ChangeSetting([](const NSWeather::SettingPtr& s) { s->SetCpType("WeatherNews"); }); },
      {"\"group\":\"city\"", "weather_box_ic_refresh.png"},
      {"weather_box_logo_accuweather.png"}},
 };
