@@ -114,11 +114,31 @@ Evas_Object* Widget4x2Page::Create(Evas_Object* parent, const WidgetPageDataPtr&
     return mBaseLayout;
 }
 
+// A city page that stays a city page of the same kind is filled again in
+// place: loading its layouts anew would cost most of an update.
 void Widget4x2Page::Resume()
 {
     WIDGET_RET_IF(mBaseLayout == NULL);
+    if (GetIsCityLayoutReusable() && UpdatePage() == NSWeather::ERR_OK)
+        return;
     ReleaseStateLayouts();
     BuildState();
+}
+
+bool Widget4x2Page::GetIsCityLayoutReusable() const
+{
+    NSWeather::CityPtr cityPtr = mWidgetPageDataPtr ? mWidgetPageDataPtr->GetCityPtr() : nullptr;
+    Evas_Object* cityNameLayout = GetCityPart("cityNameSwallow");
+    if (!cityPtr || !cityNameLayout)
+        return false;
+    const char* group = nullptr;
+    elm_layout_file_get(cityNameLayout, nullptr, &group);
+    return group && std::string(group) == GetCityNameGroup(mWidgetPageDataPtr->GetIsCurrentCity(cityPtr));
+}
+
+const char* Widget4x2Page::GetCityNameGroup(bool isCurrentLocation)
+{
+    return isCurrentLocation ? "cityNameCurrentLocation" : "cityName";
 }
 
 void Widget4x2Page::ReleaseStateLayouts()
@@ -182,7 +202,7 @@ Evas_Object* Widget4x2Page::CreateCityLayout()
     WIDGET_RETV_IF(cityLayout == NULL, nullptr);
     elm_object_part_content_set(mBaseLayout, "content", cityLayout);
     bool isCurrent = mWidgetPageDataPtr->GetIsCurrentCity(mWidgetPageDataPtr->GetCityPtr());
-    Evas_Object* cityNameLayout = LoadLayout(cityLayout, isCurrent ? "cityNameCurrentLocation" : "cityName");
+    Evas_Object* cityNameLayout = LoadLayout(cityLayout, GetCityNameGroup(isCurrent));
     Evas_Object* iconAndtemperatureLayout = LoadLayout(cityLayout, "iconAndTemperature");
     Evas_Object* bottomLineLayout = LoadLayout(cityLayout, "bottomLine");
     Evas_Object* cpLogoLayout =

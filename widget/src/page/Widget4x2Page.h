@@ -57,6 +57,8 @@ protected:
 
 private:
     bool BuildState();
+    bool GetIsCityLayoutReusable() const;
+    static const char* GetCityNameGroup(bool isCurrentLocation);
     bool GetIsLoading(bool isNetworkAvailable, bool isLocationEnabled) const;
     Evas_Object* CreateNoCityLayout(bool isLoading);
     Evas_Object* CreateCityLayout();

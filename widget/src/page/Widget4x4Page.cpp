@@ -46,9 +46,28 @@ void Widget4x4Page::UpdateWeekly(Evas_Object* weatherForecastLayout)
     WIDGET_RET_IF(!mWidgetPageDataPtr);
     std::string widgetResEdjPath = WidgetPageData::GetResourceEdjPath();
     WIDGET_RET_IF(widgetResEdjPath.length() < 1);
+    ClearDays(weatherForecastLayout);
     for (int row = 1; row <= kForecastDays; ++row)
         if (!UpdateDay(weatherForecastLayout, row))
             return;
+}
+
+// A layout filled again for another city must not keep that city's days.
+void Widget4x4Page::ClearDays(Evas_Object* forecastLayout)
+{
+    Evas_Object* edje = elm_layout_edje_get(forecastLayout);
+    for (int row = 1; row <= kForecastDays; ++row)
+    {
+        std::string number = std::to_string(row);
+        for (const char* text : {"weatherForecastHighTemp", "weatherForecastLowTemp", "weatherForecastWeek"})
+            edje_object_part_text_set(edje, (text + number).c_str(), "");
+        for (const char* image : {"weatherForecastIcon", "weatherForecastPressIcon"})
+        {
+            Evas_Object* old = elm_object_part_content_unset(forecastLayout, (image + number).c_str());
+            if (old)
+                evas_object_del(old);
+        }
+    }
 }
 
 bool Widget4x4Page::UpdateDay(Evas_Object* forecastLayout, int row)

@@ -79,3 +79,22 @@ TEST_F(WidgetViewResumeTest, FollowsTheCityAnotherProcessChose)
 }
 
 }  // namespace WeatherTest
+
+namespace WeatherTest
+{
+
+// Pages are filled again in place: nothing of the earlier data may stay.
+TEST_F(WidgetViewResumeTest, UpdatedPageShowsOnlyTheNewDays)
+{
+    EXPECT_NE(CentreText(Id(1), "weatherForecastHighTemp4"), "");
+    WriteCities(3, 2);
+    ChangeSetting([](const NSWeather::SettingPtr& s) { s->SetLastRefreshedTime(time(nullptr)); });
+    EXPECT_EQ(Send("update " + Id(1)), "OK");
+    WaitIdle();
+    EXPECT_NE(CentreText(Id(1), "weatherForecastHighTemp2"), "");
+    for (const char* part : {"weatherForecastHighTemp3", "weatherForecastWeek4", "weatherForecastLowTemp4"})
+        EXPECT_EQ(CentreText(Id(1), part), "") << part;
+    EXPECT_EQ(Slot(Id(1), "centerLayout").find("weatherForecastIcon3\":{"), std::string::npos);
+}
+
+}  // namespace WeatherTest
