@@ -63,6 +63,8 @@ struct Canvas
 template <typename Controller>
 void Rebuild(benchmark::State& state, int h)
 {
+    // The three pages lie on top of each other here; in a view the slots
+    // clip the neighbours away, so drawing costs less there.
     Canvas canvas(712, h);
     WidgetMain* widgetMain = WidgetMain::GetInstance();
     widgetMain->LoadAllWeatherInformation();
@@ -87,13 +89,14 @@ void BM_Rebuild4x4(benchmark::State& state)
 {
     Rebuild<Widget4x4PageController>(state, 712);
 }
-BENCHMARK(BM_Rebuild4x4)->Unit(benchmark::kMillisecond);
+// Argument 1 draws the canvas after the rebuild, 0 leaves it undrawn.
+BENCHMARK(BM_Rebuild4x4)->Arg(1)->Arg(0)->Unit(benchmark::kMillisecond);
 
 void BM_Rebuild4x2(benchmark::State& state)
 {
     Rebuild<Widget4x2PageController>(state, 354);
 }
-BENCHMARK(BM_Rebuild4x2)->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_Rebuild4x2)->Arg(1)->Arg(0)->Unit(benchmark::kMillisecond);
 
 // The layouts of one 4x4 city page loaded, without any text or image.
 void BM_EdjeLoad4x4Page(benchmark::State& state)

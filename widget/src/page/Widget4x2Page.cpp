@@ -93,6 +93,25 @@ Evas_Object* Widget4x2Page::LoadImage(Evas_Object* parent, const std::string& im
     return helper.CreateMultiImage(parent, WidgetPageData::GetResourceEdjPath(), imageName);
 }
 
+// Keeps the image a part already shows under that name: a page filled
+// again mostly shows the same images.
+bool Widget4x2Page::SetPartImage(Evas_Object* layout, const char* part, const std::string& imageName)
+{
+    Evas_Object* shown = elm_object_part_content_get(layout, part);
+    const char* group = nullptr;
+    if (shown && !imageName.empty())
+    {
+        elm_image_file_get(shown, nullptr, &group);
+        if (group && imageName == group)
+            return true;
+    }
+    Evas_Object* image = LoadImage(layout, imageName);
+    if (!image)
+        return false;
+    elm_object_part_content_set(layout, part, image);
+    return true;
+}
+
 Evas_Object* Widget4x2Page::GetCityPart(const char* part) const
 {
     return mCityLayout ? elm_object_part_content_get(mCityLayout, part) : nullptr;
@@ -307,19 +326,16 @@ int Widget4x2Page::UpdateCityPage()
     elm_object_part_text_set(mCityLayout, "localTime", data.GetLocalTimeString().c_str());
 
     bool is4x4 = GetIs4x4();
-    Evas_Object* icon = LoadImage(iconLayout, data.GetWeatherIconPath(is4x4, false));
-    Evas_Object* iconPress = LoadImage(iconLayout, data.GetWeatherIconPath(is4x4, true));
-    WIDGET_RETV_IF(icon == NULL || iconPress == NULL, -1);
-    elm_object_part_content_set(iconLayout, "icon", icon);
-    elm_object_part_content_set(iconLayout, "iconPress", iconPress);
+    bool icon = SetPartImage(iconLayout, "icon", data.GetWeatherIconPath(is4x4, false));
+    bool iconPress = SetPartImage(iconLayout, "iconPress", data.GetWeatherIconPath(is4x4, true));
+    WIDGET_RETV_IF(!icon || !iconPress, -1);
     std::string current = data.GetCurrentTemperatureString();
     WIDGET_RETV_IF(current.length() < 1, -1);
     elm_object_part_text_set(iconLayout, "current", current.c_str());
-    Evas_Object* unit = LoadImage(iconLayout, data.GetTemperatureUnitIconPath(is4x4, false));
-    Evas_Object* unitPress = LoadImage(iconLayout, data.GetTemperatureUnitIconPath(is4x4, true));
-    WIDGET_RETV_IF(unit == NULL || unitPress == NULL, -1);
-    elm_object_part_content_set(iconLayout, "currentUnit", unit);
-    elm_object_part_content_set(iconLayout, "currentUnitPress", unitPress);
+    bool unit = SetPartImage(iconLayout, "currentUnit", data.GetTemperatureUnitIconPath(is4x4, false));
+    bool unitPress =
+        SetPartImage(iconLayout, "currentUnitPress", data.GetTemperatureUnitIconPath(is4x4, true));
+    WIDGET_RETV_IF(!unit || !unitPress, -1);
 
     UpdateCityExtras(mCityLayout);
     WIDGET_RETV_IF(!UpdateBottomLine(bottomLine), -1);
@@ -367,12 +383,8 @@ void Widget4x2Page::ShowBottomLineMessage(const char* message)
 void Widget4x2Page::UpdateLogo(Evas_Object* bottomLine)
 {
     std::string logo = mWidgetPageDataPtr->GetCPLogoIconPath();
-    Evas_Object* logoImage = LoadImage(bottomLine, logo);
-    if (logoImage)
-    {
-        elm_object_part_content_set(bottomLine, "cpLogo", logoImage);
+    if (!logo.empty() && SetPartImage(bottomLine, "cpLogo", logo))
         return;
-    }
     WIDGET_LOG("no provider logo: %s", logo.c_str());
     Evas_Object* old = elm_object_part_content_unset(bottomLine, "cpLogo");
     if (old)

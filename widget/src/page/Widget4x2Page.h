@@ -46,6 +46,7 @@ protected:
 
     Evas_Object* LoadLayout(Evas_Object* parent, const char* group);
     Evas_Object* LoadImage(Evas_Object* parent, const std::string& imageName);
+    bool SetPartImage(Evas_Object* layout, const char* part, const std::string& imageName);
     Evas_Object* GetCityPart(const char* part) const;
 
     Evas_Object* mNoCityLayout = nullptr;

@@ -39,24 +39,28 @@ void Widget4x4Page::EmitToday(const char* signal)
     elm_object_signal_emit(forecastLayout, signal, "weatherForecast");
 }
 
-// Rows after a missing day keep what they showed.
+// The first missing day ends the rows; it and the later rows stay empty.
 void Widget4x4Page::UpdateWeekly(Evas_Object* weatherForecastLayout)
 {
     WIDGET_RET_IF(weatherForecastLayout == NULL);
     WIDGET_RET_IF(!mWidgetPageDataPtr);
     std::string widgetResEdjPath = WidgetPageData::GetResourceEdjPath();
     WIDGET_RET_IF(widgetResEdjPath.length() < 1);
-    ClearDays(weatherForecastLayout);
     for (int row = 1; row <= kForecastDays; ++row)
+    {
         if (!UpdateDay(weatherForecastLayout, row))
+        {
+            ClearDays(weatherForecastLayout, row);
             return;
+        }
+    }
 }
 
 // A layout filled again for another city must not keep that city's days.
-void Widget4x4Page::ClearDays(Evas_Object* forecastLayout)
+void Widget4x4Page::ClearDays(Evas_Object* forecastLayout, int firstRow)
 {
     Evas_Object* edje = elm_layout_edje_get(forecastLayout);
-    for (int row = 1; row <= kForecastDays; ++row)
+    for (int row = firstRow; row <= kForecastDays; ++row)
     {
         std::string number = std::to_string(row);
         for (const char* text : {"weatherForecastHighTemp", "weatherForecastLowTemp", "weatherForecastWeek"})
@@ -86,13 +90,12 @@ bool Widget4x4Page::UpdateDay(Evas_Object* forecastLayout, int row)
     std::string weekday = data.GetWeeklyWeekdayString(cityPtr, day);
     WIDGET_RETV_IF(weekday.length() < 1, false);
     edje_object_part_text_set(edje, ("weatherForecastWeek" + number).c_str(), weekday.c_str());
-    Evas_Object* fcstImage = LoadImage(forecastLayout, data.GetWeeklyIconPath(cityPtr, day, false));
-    WIDGET_RETV_IF(NULL == fcstImage, false);
-    elm_object_part_content_set(forecastLayout, ("weatherForecastIcon" + number).c_str(), fcstImage);
-    Evas_Object* fcstPressImage = LoadImage(forecastLayout, data.GetWeeklyIconPath(cityPtr, day, true));
-    WIDGET_RETV_IF(NULL == fcstPressImage, false);
-    elm_object_part_content_set(forecastLayout, ("weatherForecastPressIcon" + number).c_str(),
-                                fcstPressImage);
+    bool fcstImage = SetPartImage(forecastLayout, ("weatherForecastIcon" + number).c_str(),
+                                  data.GetWeeklyIconPath(cityPtr, day, false));
+    WIDGET_RETV_IF(!fcstImage, false);
+    bool fcstPressImage = SetPartImage(forecastLayout, ("weatherForecastPressIcon" + number).c_str(),
+                                       data.GetWeeklyIconPath(cityPtr, day, true));
+    WIDGET_RETV_IF(!fcstPressImage, false);
     return true;
 }
 

@@ -27,7 +27,7 @@ protected:
 
 private:
     bool UpdateDay(Evas_Object* forecastLayout, int row);
-    static void ClearDays(Evas_Object* forecastLayout);
+    static void ClearDays(Evas_Object* forecastLayout, int firstRow);
 };
 
 }  // namespace NSWeatherWidget
