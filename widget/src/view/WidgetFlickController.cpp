@@ -7,7 +7,7 @@
 namespace NSWeatherWidget
 {
 
-bool WidgetFlickController::sIsTransiting = false;
+bool WidgetFlickController::mIsTransiging = false;
 Elm_Transit* WidgetFlickController::sTransit = nullptr;
 WidgetFlickController* WidgetFlickController::sTransitOwner = nullptr;
 
@@ -23,7 +23,7 @@ WidgetFlickController::~WidgetFlickController()
     {
         ecore_job_del(mDisplayedCityJob);
         mDisplayedCityJob = nullptr;
-        sIsTransiting = false;
+        mIsTransiging = false;
     }
     if (sTransitOwner == this)
     {
@@ -32,7 +32,7 @@ WidgetFlickController::~WidgetFlickController()
         Elm_Transit* transit = sTransit;
         sTransitOwner = nullptr;
         sTransit = nullptr;
-        sIsTransiting = false;
+        mIsTransiging = false;
         if (transit)
             elm_transit_del(transit);
     }
@@ -48,15 +48,16 @@ void WidgetFlickController::ReleaseTouchObject()
     mTouchObject = nullptr;
 }
 
-void WidgetFlickController::Activate(const std::string& part)
+void WidgetFlickController::Activate(const std::string& partName)
 {
-    WIDGET_RET_IF(part.empty());
+    const char* part = partName.empty() ? NULL : partName.c_str();
+    WIDGET_RET_IF(part == NULL);
     WIDGET_RET_IF(mWidgetFlickEventListener == NULL);
     Evas_Object* widgetBaseLayout = mWidgetFlickEventListener->OnGetBaseLayout();
     WIDGET_RET_IF(widgetBaseLayout == NULL);
     ReleaseTouchObject();
-    mTouchObject = const_cast<Evas_Object*>(
-        edje_object_part_object_get(elm_layout_edje_get(widgetBaseLayout), part.c_str()));
+    mTouchObject =
+        const_cast<Evas_Object*>(edje_object_part_object_get(elm_layout_edje_get(widgetBaseLayout), part));
     WIDGET_RET_IF(mTouchObject == NULL);
     evas_object_event_callback_add(mTouchObject, EVAS_CALLBACK_MOUSE_UP, BackgroundMouseUpCb, this);
     evas_object_event_callback_add(mTouchObject, EVAS_CALLBACK_MOUSE_DOWN, BackgroundMouseDownCb, this);
@@ -79,8 +80,9 @@ void WidgetFlickController::BackgroundMouseDownCb(void* data, Evas*, Evas_Object
 
 void WidgetFlickController::OnMouseDown(const Evas_Event_Mouse_Down* ev)
 {
-    WIDGET_RET_IF(WidgetFlickController::sIsTransiting == true);
-    WIDGET_RET_IF(this->mTouchObject == NULL);
+    WidgetFlickController* pThis = this;
+    WIDGET_RET_IF(WidgetFlickController::mIsTransiging == true);
+    WIDGET_RET_IF(pThis->mTouchObject == NULL);
     WIDGET_RET_IF(ev == NULL);
     mDownX = ev->canvas.x;
     mDownY = ev->canvas.y;
@@ -97,9 +99,10 @@ void WidgetFlickController::BackgroundMouseUpCb(void* data, Evas*, Evas_Object* 
 
 void WidgetFlickController::OnMouseUp(const Evas_Event_Mouse_Up* ev, Evas_Object* obj)
 {
-    WIDGET_RET_IF(this->mWidgetFlickEventListener == NULL);
-    WIDGET_RET_IF(WidgetFlickController::sIsTransiting == true);
-    WIDGET_RET_IF(this->mTouchObject == NULL);
+    WidgetFlickController* pThis = this;
+    WIDGET_RET_IF(pThis->mWidgetFlickEventListener == NULL);
+    WIDGET_RET_IF(WidgetFlickController::mIsTransiging == true);
+    WIDGET_RET_IF(pThis->mTouchObject == NULL);
     WIDGET_RET_IF(ev == NULL);
     if (ev->timestamp > kMinimumTimestamp)
         mUpTimestamp = ev->timestamp;
@@ -148,7 +151,7 @@ void WidgetFlickController::StartFlick(Direction direction)
 void WidgetFlickController::TransitStart()
 {
     WIDGET_RET_IF(mWidgetFlickEventListener == NULL);
-    WIDGET_RET_IF(WidgetFlickController::sIsTransiting == true);
+    WIDGET_RET_IF(WidgetFlickController::mIsTransiging == true);
     Evas_Object* centerLayout = mWidgetFlickEventListener->OnGetCenterLayout();
     Evas_Object* prevLayout = mWidgetFlickEventListener->OnGetPrevLayout();
     Evas_Object* nextLayout = mWidgetFlickEventListener->OnGetNextLayout();
@@ -168,7 +171,7 @@ void WidgetFlickController::TransitStart()
     elm_transit_objects_final_state_keep_set(transit, EINA_TRUE);
     elm_transit_del_cb_set(transit, TransitDeleteCb, this);
     elm_transit_duration_set(transit, kSlideSeconds);
-    sIsTransiting = true;
+    mIsTransiging = true;
     sTransit = transit;
     sTransitOwner = this;
     elm_transit_go(transit);
@@ -200,7 +203,7 @@ void WidgetFlickController::OnTransitDeleted(Elm_Transit*)
     if (!mWidgetFlickEventListener)
     {
         WIDGET_LOG("mWidgetFlickEventListener is NULL");
-        sIsTransiting = false;
+        mIsTransiging = false;
         return;
     }
     if (!mDisplayedCityJob)
@@ -213,7 +216,7 @@ void WidgetFlickController::DisplayedCityJobCb(void* data)
     if (!pThis)
         return;
     pThis->mDisplayedCityJob = nullptr;
-    sIsTransiting = false;
+    mIsTransiging = false;
     if (!pThis->mWidgetFlickEventListener)
         return;
     if (pThis->mFlickDirection == DIRECTION_NEXT)

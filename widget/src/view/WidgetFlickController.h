@@ -33,13 +33,13 @@ public:
     WidgetFlickController(const WidgetFlickController&) = delete;
     WidgetFlickController& operator=(const WidgetFlickController&) = delete;
 
-    void Activate(const std::string& part);
+    void Activate(const std::string& partName);
     // Not owned; the view that owns this controller.
     void SetWidgetFlickEventListener(WidgetFlickEventListener* listener)
     {
         mWidgetFlickEventListener = listener;
     }
-    static bool GetIsTransiting() { return sIsTransiting; }
+    static bool GetIsTransiting() { return mIsTransiging; }
 
 private:
     void OnMouseDown(const Evas_Event_Mouse_Down* ev);
@@ -70,7 +70,7 @@ private:
     Ecore_Job* mDisplayedCityJob = nullptr;
 
     // From the start of a slide until its rotation has run.
-    static bool sIsTransiting;
+    static bool mIsTransiging;
     static Elm_Transit* sTransit;
     static WidgetFlickController* sTransitOwner;
 };
