@@ -1,6 +1,8 @@
 // Vertical swipes fed through the host move between cities.
 #include <gtest/gtest.h>
 
+#include "FileUtil.h"
+#include "TestDB.h"
 #include "WidgetHostPages.h"
 
 namespace WeatherTest
@@ -113,6 +115,28 @@ TEST_F(WidgetFlickTest, InstanceDestroyedDuringASlideReleasesTheLock)
     Swipe(2, -150);
     WaitIdle();
     EXPECT_EQ(CentreText(Id(2), "name"), kNames[1]);
+}
+
+}  // namespace WeatherTest
+
+namespace WeatherTest
+{
+
+// With page indexes 0, 2, 3 the list positions 0, 1, 2 decide the pages.
+TEST_F(WidgetFlickTest, GapInPageIndexesFollowsListPositions)
+{
+    WriteCities(4);
+    RawDB(NSWeather::FileUtil::GetWeatherDBFilePath())
+        .Exec("UPDATE CITY_TABLE SET pageIndex = 4 WHERE pageIndex = 1");
+    ChangeSetting([](const NSWeather::SettingPtr& s) { s->SetCurrentCityLocationId("347629"); });
+    StartHost({"4x2"});
+    EXPECT_EQ(CentreText(Id(1), "name"), "San Francisco");
+    EXPECT_NE(Slot(Id(1), "prevLayout").find("서울"), std::string::npos);
+    EXPECT_NE(Slot(Id(1), "nextLayout").find("Berlin"), std::string::npos);
+    Swipe(1, -150);
+    WaitIdle();
+    EXPECT_EQ(CentreText(Id(1), "name"), "Berlin");
+    EXPECT_EQ(ReadSetting()->GetCurrentCityLocationId(), "178087");
 }
 
 }  // namespace WeatherTest
