@@ -1,0 +1,51 @@
+#ifndef WEATHER_TESTS_WIDGET_HOST_PAGES_H
+#define WEATHER_TESTS_WIDGET_HOST_PAGES_H
+
+#include <sys/types.h>
+
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "Setting.h"
+#include "TestPlatform.h"
+#include "widget/ControlClient.h"
+
+namespace WeatherTest
+{
+
+// The real weather-widget under the host, on a fresh root with real
+// database files and system keys, driven through the control socket.
+class WidgetHostPagesTest : public PlatformTest
+{
+public:
+    static const char* const kWidgetId;
+
+    void SetUp() override;
+    void TearDown() override;
+
+    // Sample cities written through the store (see widget/samples).
+    void WriteCities(int count, int days = 7, bool firstIsCurrentLocation = false);
+    void ChangeSetting(const std::function<void(const NSWeather::SettingPtr&)>& change);
+    NSWeather::SettingPtr ReadSetting();
+    void SetKey(const char* key, int value);
+
+    void StartHost(const std::vector<std::string>& sizes);
+    std::string Send(const std::string& command);
+    std::string Id(int n) const { return std::string(kWidgetId) + ":" + std::to_string(n); }
+    void WaitIdle();
+    // The JSON of one page slot ("centerLayout" ...) of an instance's dump.
+    std::string Slot(const std::string& id, const std::string& slot);
+    // The text of `part` in the centre page of an instance ("" if none).
+    std::string CentreText(const std::string& id, const std::string& part);
+    std::vector<std::string> Launches() const;
+    // Lines of the widget process's log that contain `text`.
+    int CountLog(const std::string& text) const;
+
+    pid_t mHostPid = -1;
+    platform::ControlClient mClient;
+};
+
+}  // namespace WeatherTest
+
+#endif

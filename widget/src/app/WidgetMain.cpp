@@ -1,0 +1,71 @@
+#include "WidgetMain.h"
+
+#include <stdexcept>
+
+#include "DBController.h"
+#include "SettingDBController.h"
+#include "WidgetLog.h"
+#include "WidgetViewController.h"
+
+namespace NSWeatherWidget
+{
+
+using NSWeather::CityPtr;
+using NSWeather::CityPtrVectorPtr;
+
+WidgetMain* WidgetMain::GetInstance()
+{
+    // Lives until the process ends: callbacks may still arrive at exit.
+    static WidgetMain* sInstance = new WidgetMain();
+    return sInstance;
+}
+
+void WidgetMain::LoadAllWeatherInformation()
+{
+    NSWeather::SettingDBController settingDBController;
+    mSettingPtr = settingDBController.Select();
+    WIDGET_RET_IF(!mSettingPtr);
+    NSWeather::DBController dbController;
+    mWeatherInfo = dbController.SelectAllCityData();
+    mLastRefreshedTime = mSettingPtr->GetLastRefreshedTime();
+}
+
+CityPtrVectorPtr WidgetMain::GetWeatherInfo()
+{
+    LoadAllWeatherInformation();
+    return mWeatherInfo;
+}
+
+CityPtr WidgetMain::GetCityPtr(int position) const
+{
+    WIDGET_RETV_IF(!mWeatherInfo, nullptr);
+    WIDGET_RETV_IF(position < 0 || position >= static_cast<int>(mWeatherInfo->size()), nullptr);
+    return (*mWeatherInfo)[static_cast<size_t>(position)];
+}
+
+bool WidgetMain::IsCurrentLocationExist() const
+{
+    if (!mWeatherInfo)
+        return false;
+    for (const CityPtr& cityPtr : *mWeatherInfo)
+        if (cityPtr && cityPtr->GetIsCurrentLocation())
+            return true;
+    return false;
+}
+
+WidgetViewControllerPtr WidgetMain::FindWidgetObject(const std::string& idString) const
+{
+    WIDGET_RETV_IF(idString.length() < 1, nullptr);
+    for (const auto& entry : sWidgetViewControllerList)
+        if (entry.first && *entry.first == idString)
+            return entry.second;
+    return nullptr;
+}
+
+void WidgetMain::Unregister(const WidgetViewControllerPtr& controller)
+{
+    for (auto it = sWidgetViewControllerList.begin(); it != sWidgetViewControllerList.end();)
+        it = it->second == controller ? sWidgetViewControllerList.erase(it) : it + 1;
+}
+
+}  // namespace NSWeatherWidget

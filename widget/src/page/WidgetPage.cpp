@@ -1,0 +1,1 @@
+#include "WidgetPage.h"
