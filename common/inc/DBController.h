@@ -42,9 +42,11 @@ public:
     std::string GetLocationIdOfCurrentCity();
     bool IsCurrentLocationExist();
 
-    // Writers return ERR_OK or ERR_FAIL. A city with the location id and
-    // current-location flag of a stored one is not inserted (ERR_FAIL); a
-    // city that is not stored is not updated (ERR_FAIL).
+    // Writers return ERR_OK or ERR_FAIL. ERR_FAIL also when any statement of
+    // the operation failed (locked, full or read-only file): then nothing of
+    // it is kept. A city with the location id and current-location flag of
+    // a stored one is not inserted (ERR_FAIL); a city that is not stored is
+    // not updated (ERR_FAIL).
     int InsertCityData(CityPtr cityPtr);
     int UpdateCityData(CityPtr cityPtr);
     // The count never drops below 0.
@@ -65,19 +67,28 @@ public:
     // interval of the settings.
     bool GetIsWeatherInfoExpired();
 
-    // Defined by another engineer in common/src/db/DBControllerUpgrade.cpp.
+    // Defined in common/src/db/DBControllerUpgrade.cpp. ERR_FAIL when a
+    // step could not run; the version is then left for the next start.
     int UpgradeDB();
     int UpgradeDB(double currentVersion);
+    // The widget icon for a WeatherNews icon number, 0 on any failure.
     int GetWeatherNewsIcon(int iconId, bool isDayTime);
 
 private:
+    enum class InsertResult
+    {
+        INSERTED,
+        ALREADY_STORED,
+        FAILED,
+    };
+
     CityPtr SelectDataWithPrimaryKey(CityDBController& cityDBController, int primaryKey);
     CityPtrVectorPtr SelectAllCities(CityDBController& cityDBController);
-    bool InsertIfNew(CityDBController& cityDBController, CityPtr cityPtr);
-    void InsertDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr);
+    InsertResult InsertIfNew(CityDBController& cityDBController, CityPtr cityPtr);
+    bool InsertDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr);
     bool UpdateDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr);
-    void DeleteDataWithPrimaryKey(CityDBController& cityDBController, int primaryKey);
-    void DeleteAll(CityDBController& cityDBController);
+    bool DeleteDataWithPrimaryKey(CityDBController& cityDBController, int primaryKey);
+    bool DeleteAll(CityDBController& cityDBController);
     // The page index of a city without one is looked up by its location id.
     int ResolvePrimaryKey(CityDBController& cityDBController, const CityPtr& cityPtr);
 };

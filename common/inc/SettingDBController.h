@@ -1,9 +1,9 @@
 #ifndef NSWEATHER_SETTING_DB_CONTROLLER_H
 #define NSWEATHER_SETTING_DB_CONTROLLER_H
 
+#include <functional>
 #include <string>
 
-#include "QueryGenernator.h"
 #include "Setting.h"
 
 namespace NSWeather
@@ -12,8 +12,9 @@ namespace NSWeather
 class DBStatement;
 
 // The one settings row that the suite's processes share ("db/.setting.db").
-// Select, Update and UpdateLocationIdOfDisplayCity run their own cycle;
-// CreateTable, Insert and IsSettingTableExist run on the caller's.
+// Select, Update, SelectAndUpdate and UpdateLocationIdOfDisplayCity run
+// their own cycle; CreateTable, Insert and IsSettingTableExist run on the
+// caller's. Writers return ERR_OK, or ERR_FAIL with nothing written.
 class SettingDBController
 {
 public:
@@ -24,13 +25,19 @@ public:
     // ERR_OK, or ERR_FAIL when the database cannot be opened or takes no row.
     int Initialize();
     bool IsSettingTableExist();
-    void CreateTable();
-    void Insert(const SettingPtr& settingPtr);
+    bool CreateTable();
+    int Insert(const SettingPtr& settingPtr);
     // Rewrites the whole row from the record; a null record writes nothing.
-    void Update(const SettingPtr& settingPtr);
-    void UpdateLocationIdOfDisplayCity(const std::string& locationId);
+    int Update(const SettingPtr& settingPtr);
+    int UpdateLocationIdOfDisplayCity(const std::string& locationId);
     // Null when there is no row or the database cannot be read.
     SettingPtr Select();
+    // Reads the row, lets `change` edit it and writes it back whole, in one
+    // write transaction taken before the read (BEGIN IMMEDIATE), so a write by
+    // another process in between is never undone. Returns the record as
+    // written, or null (nothing written, logged) when there is no row or any
+    // step fails.
+    SettingPtr SelectAndUpdate(const std::function<void(const SettingPtr&)>& change);
     // The settings row has had the same columns in every version.
     void UpgradeDB(double currentVersion);
 
@@ -38,8 +45,7 @@ private:
     static void BindSetting(DBStatement& statement, const SettingPtr& settingPtr);
     static SettingPtr ReadSetting(const DBStatement& statement);
     SettingPtr SelectRow();
-
-    QueryGenernator mQueryGenernator;
+    bool UpdateRow(const SettingPtr& settingPtr);
 };
 
 }  // namespace NSWeather

@@ -3,7 +3,6 @@
 
 #include <string>
 
-#include "QueryGenernator.h"
 #include "ShareTarget.h"
 
 namespace NSWeather
@@ -21,9 +20,10 @@ public:
     int Initialize();
     // Runs on the caller's cycle.
     bool IsShareTargetTableExist();
-    void CreateTable();
-    // Own cycle; a target whose application id is already stored is skipped.
-    void Insert(const ShareTargetPtr& shareTargetPtr);
+    bool CreateTable();
+    // Own cycle; a target whose application id is already stored is skipped
+    // (ERR_OK). ERR_FAIL when the table could not be read or written.
+    int Insert(const ShareTargetPtr& shareTargetPtr);
     // Own cycle; an empty vector when there is no row, null when the
     // database cannot be opened.
     ShareTargetPtrVectorPtr Select();
@@ -34,8 +34,6 @@ private:
     // stepResult: the last step, SQLITE_DONE when every row was seen.
     bool IsAppIdStored(const std::string& appId, int& stepResult);
     ShareTargetPtrVectorPtr SelectRows();
-
-    QueryGenernator mQueryGenernator;
 };
 
 }  // namespace NSWeather

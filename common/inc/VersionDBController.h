@@ -1,8 +1,6 @@
 #ifndef NSWEATHER_VERSION_DB_CONTROLLER_H
 #define NSWEATHER_VERSION_DB_CONTROLLER_H
 
-#include "QueryGenernator.h"
-
 namespace NSWeather
 {
 
@@ -22,14 +20,13 @@ public:
     // On the caller's cycle; -1.0 when there is no row.
     double GetCurrentVersion();
     double GetLatestDBVersion() const;
-    void Insert(double version);
-    void Update(double version);
+    // Insert, Update and CreateTable run on the caller's cycle; false when
+    // the statement failed.
+    bool Insert(double version);
+    bool Update(double version);
     // Own cycle: stores the version. false when it could not be written.
     bool UpgradeDB(double version);
-    void CreateTable();
-
-private:
-    QueryGenernator mQueryGenernator;
+    bool CreateTable();
 };
 
 }  // namespace NSWeather

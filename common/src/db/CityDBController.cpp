@@ -1,7 +1,6 @@
 #include "CityDBController.h"
 
 #include <functional>
-#include <stdexcept>
 #include <vector>
 
 #include "CommonLog.h"
@@ -13,7 +12,8 @@ namespace NSWeather
 
 const char* const CityDBController::TABLE_NAME = "CITY_TABLE";
 const char* const CityDBController::CREATE_TABLE_FORMAT =
-    "CREATE TABLE IF NOT EXISTS %s (PK_ID\t\t\t\tINTEGER NOT NULL PRIMARY KEY AUTOINCREMENT,pageIndex\t\t\tINTEGER,"
+    "CREATE TABLE IF NOT EXISTS %s (PK_ID\t\t\t\tINTEGER NOT NULL PRIMARY KEY "
+    "AUTOINCREMENT,pageIndex\t\t\tINTEGER,"
     "locationId\t\t\tTEXT,cityName\t\t\tTEXT,cityNameEng\t\tTEXT,countryName\t\tTEXT,countryNameEng\t\tTEXT,"
     "isCurrentLocation\tINTEGER,isSummerTime\t\tINTEGER,isDayTime\t\t\tINTEGER,gmtOffset\t\t\tDOUBLE,"
     "refreshedTime\t\tINT64,localTime\t\t\tINT64,widgetReferenceCount\t\tINTEGER,needToUpdate\t\tINTEGER,"
@@ -72,9 +72,7 @@ CityPtr ReadCity(const DBStatement& stmt)
     return cityPtr;
 }
 
-void NoBinding(DBStatement&)
-{
-}
+void NoBinding(DBStatement&) {}
 
 std::function<void(DBStatement&)> BindIntAt1(int value)
 {
@@ -86,24 +84,15 @@ std::function<void(DBStatement&)> BindTextAt1(const std::string& value)
     return [value](DBStatement& stmt) { stmt.BindText(1, value); };
 }
 
-void StepDelete(DBStatement& stmt)
-{
-    if (stmt.Step() != SQLITE_DONE)
-        COMMON_LOG("Fail to Delete");
-}
 }  // namespace
 
-CityDBController::CityDBController()
-{
-}
+CityDBController::CityDBController() {}
 
-CityDBController::~CityDBController()
-{
-}
+CityDBController::~CityDBController() {}
 
-void CityDBController::CreateTable()
+bool CityDBController::CreateTable()
 {
-    TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
+    return TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
 }
 
 std::string CityDBController::ResolveLocationId(CityPtr cityPtr)
@@ -121,21 +110,21 @@ std::string CityDBController::ResolveLocationId(CityPtr cityPtr)
     return locationId;
 }
 
-void CityDBController::Insert(CityPtr cityPtr)
+bool CityDBController::Insert(CityPtr cityPtr)
 {
-    COMMON_RET_IF(!cityPtr);
+    COMMON_RETV_IF(!cityPtr, false);
     std::string locationId = ResolveLocationId(cityPtr);
     DBStatement stmt(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS));
     int i = BindCommonColumns(stmt, cityPtr, locationId);
     stmt.BindInt(i++, cityPtr->GetWidgetReferenceCount());
     stmt.BindInt(i++, cityPtr->GetNeedToUpdate() ? 1 : 0);
     stmt.BindText(i++, cityPtr->GetWebsiteUrl());
-    stmt.Step();
+    return stmt.Execute();
 }
 
-void CityDBController::Update(CityPtr cityPtr, int primaryKey)
+bool CityDBController::Update(CityPtr cityPtr, int primaryKey)
 {
-    COMMON_RET_IF(!cityPtr);
+    COMMON_RETV_IF(!cityPtr, false);
     std::string locationId = ResolveLocationId(cityPtr);
     DBStatement stmt(mQueryGenernator.MakeUpdateQuery(TABLE_NAME, UPDATE_ASSIGNMENTS,
                                                       mQueryGenernator.MakeWhereClause("PK_ID = ?;")));
@@ -143,10 +132,10 @@ void CityDBController::Update(CityPtr cityPtr, int primaryKey)
     stmt.BindInt(i++, cityPtr->GetNeedToUpdate() ? 1 : 0);
     stmt.BindText(i++, cityPtr->GetWebsiteUrl());
     stmt.BindInt(i++, primaryKey);
-    stmt.Step();
+    return stmt.Execute();
 }
 
-void CityDBController::UpdateOnlyWidgetReferenceCount(const std::string& locationId, int count)
+bool CityDBController::UpdateOnlyWidgetReferenceCount(const std::string& locationId, int count)
 {
     std::string query = mQueryGenernator.MakeUpdateQuery(TABLE_NAME, "widgetReferenceCount = ?",
                                                          mQueryGenernator.MakeWhereClause("locationId = ?;"));
@@ -154,17 +143,17 @@ void CityDBController::UpdateOnlyWidgetReferenceCount(const std::string& locatio
     DBStatement stmt(query);
     stmt.BindInt(1, count);
     stmt.BindText(2, locationId);
-    stmt.Step();
+    return stmt.Execute();
 }
 
-void CityDBController::UpdateOnlyMobileLink(CityPtr cityPtr, int primaryKey)
+bool CityDBController::UpdateOnlyMobileLink(CityPtr cityPtr, int primaryKey)
 {
-    COMMON_RET_IF(!cityPtr);
+    COMMON_RETV_IF(!cityPtr, false);
     DBStatement stmt(mQueryGenernator.MakeUpdateQuery(TABLE_NAME, "websiteUrl = ?",
                                                       mQueryGenernator.MakeWhereClause("PK_ID = ?;")));
     stmt.BindText(1, cityPtr->GetWebsiteUrl());
     stmt.BindInt(2, primaryKey);
-    stmt.Step();
+    return stmt.Execute();
 }
 
 int CityDBController::GetLastInsertedPrimaryKey()
@@ -182,7 +171,8 @@ int CityDBController::GetLastInsertedPrimaryKey()
 int CityDBController::SelectInt(const std::string& column, const std::string& condition, const Binder& binder,
                                 int defaultValue)
 {
-    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, column, mQueryGenernator.MakeWhereClause(condition)));
+    DBStatement stmt(
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, column, mQueryGenernator.MakeWhereClause(condition)));
     binder(stmt);
     int rc = stmt.Step();
     if (rc != SQLITE_ROW)
@@ -196,7 +186,8 @@ int CityDBController::SelectInt(const std::string& column, const std::string& co
 std::string CityDBController::SelectText(const std::string& column, const std::string& condition,
                                          const Binder& binder)
 {
-    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, column, mQueryGenernator.MakeWhereClause(condition)));
+    DBStatement stmt(
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, column, mQueryGenernator.MakeWhereClause(condition)));
     binder(stmt);
     int rc = stmt.Step();
     if (rc != SQLITE_ROW)
@@ -209,8 +200,8 @@ std::string CityDBController::SelectText(const std::string& column, const std::s
 
 CityPtr CityDBController::SelectCity(const std::string& condition, const Binder& binder)
 {
-    DBStatement stmt(
-        mQueryGenernator.MakeSelectQuery(TABLE_NAME, INSERT_COLUMNS, mQueryGenernator.MakeWhereClause(condition)));
+    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, INSERT_COLUMNS,
+                                                      mQueryGenernator.MakeWhereClause(condition)));
     binder(stmt);
     int rc = stmt.Step();
     if (rc != SQLITE_ROW)
@@ -261,14 +252,13 @@ bool CityDBController::IsCurrentLocationExist()
     return GetPageIndexOfCurrentCity() != -1;
 }
 
-void CityDBController::SetPageIndexAsAscending()
+bool CityDBController::SetPageIndexAsAscending()
 {
     // Keys are collected first so no update runs under an open cursor.
     std::vector<int> keys;
     {
         DBStatement select(std::string("SELECT PK_ID FROM ") + TABLE_NAME + " ORDER BY PK_ID ASC;");
-        while (select.Step() == SQLITE_ROW)
-            keys.push_back(select.ColumnInt(0));
+        while (select.Step() == SQLITE_ROW) keys.push_back(select.ColumnInt(0));
     }
     DBStatement update(std::string("UPDATE ") + TABLE_NAME + " SET pageIndex=? WHERE PK_ID=?;");
     for (size_t counter = 0; counter < keys.size(); ++counter)
@@ -276,57 +266,58 @@ void CityDBController::SetPageIndexAsAscending()
         if (keys[counter] < 1)
         {
             COMMON_LOG("Fail to Get PrmaryKey From CityTable : %d", keys[counter]);
-            return;
+            return false;
         }
         update.Reset();
         update.BindInt(1, static_cast<int>(counter));
         update.BindInt(2, keys[counter]);
-        if (update.Step() != SQLITE_DONE)
-            COMMON_LOG("Fail to Delete");
+        if (update.Execute() == false)
+        {
+            COMMON_LOG("Fail to renumber the pages");
+            return false;
+        }
     }
+    return true;
 }
 
-void CityDBController::Delete(int primaryKey)
+bool CityDBController::Delete(int primaryKey)
 {
     {
         DBStatement stmt(std::string("DELETE FROM ") + TABLE_NAME + " WHERE PK_ID=?;");
         stmt.BindInt(1, primaryKey);
-        StepDelete(stmt);
-    }
-    SetPageIndexAsAscending();
-}
-
-void CityDBController::DeleteAll()
-{
-    TableQuery::DeleteAll(TABLE_NAME);
-}
-
-void CityDBController::Reorder(CityPtrVectorPtr reorderPtrVector)
-{
-    COMMON_RET_IF(!reorderPtrVector);
-    try
-    {
-        std::vector<int> keys;
-        for (size_t i = 0; i < reorderPtrVector->size(); ++i)
+        if (stmt.Execute() == false)
         {
-            CityPtr cityPtr = reorderPtrVector->at(i);
-            COMMON_RET_IF(!cityPtr);
-            keys.push_back(GetPrimaryKey(cityPtr->GetPageIndex()));
-        }
-        DBStatement update(std::string("UPDATE ") + TABLE_NAME + " SET pageIndex=? " + "WHERE PK_ID = ?");
-        for (size_t i = 0; i < reorderPtrVector->size(); ++i)
-        {
-            update.Reset();
-            update.BindInt(1, static_cast<int>(i));
-            update.BindInt(2, keys.at(i));
-            update.Step();
+            COMMON_LOG("Fail to Delete");
+            return false;
         }
     }
-    catch (const std::out_of_range& e)
+    return SetPageIndexAsAscending();
+}
+
+bool CityDBController::DeleteAll()
+{
+    return TableQuery::DeleteAll(TABLE_NAME);
+}
+
+bool CityDBController::Reorder(CityPtrVectorPtr reorderPtrVector)
+{
+    COMMON_RETV_IF(!reorderPtrVector, false);
+    std::vector<int> keys;
+    for (const CityPtr& cityPtr : *reorderPtrVector)
     {
-        COMMON_LOG("exception caught: out of range");
-        COMMON_LOG("[%s]", e.what());
+        COMMON_RETV_IF(!cityPtr, false);
+        keys.push_back(GetPrimaryKey(cityPtr->GetPageIndex()));
+        COMMON_RETV_IF(keys.back() < 1, false);
     }
+    DBStatement update(std::string("UPDATE ") + TABLE_NAME + " SET pageIndex=? " + "WHERE PK_ID = ?");
+    for (size_t i = 0; i < keys.size(); ++i)
+    {
+        update.Reset();
+        update.BindInt(1, static_cast<int>(i));
+        update.BindInt(2, keys[i]);
+        COMMON_RETV_IF(update.Execute() == false, false);
+    }
+    return true;
 }
 
 std::vector<std::pair<int, CityPtr>> CityDBController::SelectAll()
@@ -334,8 +325,7 @@ std::vector<std::pair<int, CityPtr>> CityDBController::SelectAll()
     std::vector<std::pair<int, CityPtr>> rows;
     DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(INSERT_COLUMNS) + ",PK_ID",
                                                       mQueryGenernator.MakeOrderByClause("PK_ID", true)));
-    while (stmt.Step() == SQLITE_ROW)
-        rows.emplace_back(stmt.ColumnInt(15), ReadCity(stmt));
+    while (stmt.Step() == SQLITE_ROW) rows.emplace_back(stmt.ColumnInt(15), ReadCity(stmt));
     return rows;
 }
 

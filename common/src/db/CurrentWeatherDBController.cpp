@@ -13,7 +13,8 @@ const char* const CurrentWeatherDBController::TABLE_NAME = "CURRENT_WEATHER_TABL
 const char* const CurrentWeatherDBController::CREATE_TABLE_FORMAT =
     "CREATE TABLE IF NOT EXISTS %s (FK_ID\t\t\t\tINTEGER,weatherIcon\t\tINTEGER,weatherStatus\t\tTEXT,"
     "curTemperature\t\tDOUBLE,lowTemperature\t\tDOUBLE,highTemperature\tDOUBLE,date\t\t\t\tINT64,"
-    "websiteUrl \t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);";
+    "websiteUrl \t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE "
+    "CASCADE);";
 
 namespace
 {
@@ -52,49 +53,47 @@ CurrentPtr ReadCurrent(const DBStatement& stmt)
 }
 }  // namespace
 
-CurrentWeatherDBController::CurrentWeatherDBController()
+CurrentWeatherDBController::CurrentWeatherDBController() {}
+
+CurrentWeatherDBController::~CurrentWeatherDBController() {}
+
+bool CurrentWeatherDBController::CreateTable()
 {
+    return TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
 }
 
-CurrentWeatherDBController::~CurrentWeatherDBController()
+bool CurrentWeatherDBController::DeleteAll()
 {
+    return TableQuery::DeleteAll(TABLE_NAME);
 }
 
-void CurrentWeatherDBController::CreateTable()
+bool CurrentWeatherDBController::Delete(int foreignKey)
 {
-    TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
+    return TableQuery::Delete(TABLE_NAME, foreignKey);
 }
 
-void CurrentWeatherDBController::DeleteAll()
+bool CurrentWeatherDBController::Insert(int foreignKey, CurrentPtr currentPtr)
 {
-    TableQuery::DeleteAll(TABLE_NAME);
+    COMMON_RETV_IF(!currentPtr, true);
+    return TableQuery::InsertRecord(
+        mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS), foreignKey,
+        currentPtr, BindValues);
 }
 
-void CurrentWeatherDBController::Delete(int foreignKey)
+bool CurrentWeatherDBController::Update(int foreignKey, CurrentPtr currentPtr)
 {
-    TableQuery::Delete(TABLE_NAME, foreignKey);
-}
-
-void CurrentWeatherDBController::Insert(int foreignKey, CurrentPtr currentPtr)
-{
-    COMMON_RET_IF(!currentPtr);
-    TableQuery::InsertRecord(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS),
-                             foreignKey, currentPtr, BindValues);
-}
-
-void CurrentWeatherDBController::Update(int foreignKey, CurrentPtr currentPtr)
-{
-    COMMON_RET_IF(!currentPtr);
-    TableQuery::UpdateRecord(mQueryGenernator.MakeUpdateQuery(TABLE_NAME, UPDATE_ASSIGNMENTS,
-                                                              mQueryGenernator.MakeWhereClause("FK_ID = ?;")),
-                             foreignKey, currentPtr, BindValues);
+    COMMON_RETV_IF(!currentPtr, true);
+    return TableQuery::UpdateRecord(
+        mQueryGenernator.MakeUpdateQuery(TABLE_NAME, UPDATE_ASSIGNMENTS,
+                                         mQueryGenernator.MakeWhereClause("FK_ID = ?;")),
+        foreignKey, currentPtr, BindValues);
 }
 
 CurrentPtr CurrentWeatherDBController::Select(int foreignKey)
 {
-    return TableQuery::Select(
-        mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS, mQueryGenernator.MakeWhereClause("FK_ID = ?")),
-        foreignKey, ReadCurrent);
+    return TableQuery::Select(mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS,
+                                                               mQueryGenernator.MakeWhereClause("FK_ID = ?")),
+                              foreignKey, ReadCurrent);
 }
 
 std::map<int, CurrentPtr> CurrentWeatherDBController::SelectAll()

@@ -21,9 +21,7 @@ DBConnector* DBConnector::GetInstance()
     return instance;
 }
 
-DBConnector::DBConnector() : mDBHandle(nullptr)
-{
-}
+DBConnector::DBConnector() : mDBHandle(nullptr), mIsCycleFailed(false), mIsImmediate(false) {}
 
 DBConnector::~DBConnector()
 {
@@ -32,6 +30,18 @@ DBConnector::~DBConnector()
 
 bool DBConnector::DBInitialize(const std::string& dbFilePath, bool isReadOnly)
 {
+    mIsImmediate = false;
+    return DBOpen(dbFilePath, isReadOnly);
+}
+
+bool DBConnector::DBInitializeImmediate(const std::string& dbFilePath)
+{
+    mIsImmediate = true;
+    return DBOpen(dbFilePath, false);
+}
+
+bool DBConnector::DBOpen(const std::string& dbFilePath, bool isReadOnly)
+{
     if (mDBHandle)
     {
         COMMON_LOG("DBInitialize is already called, mDBHandle is not NULL");
@@ -39,25 +49,29 @@ bool DBConnector::DBInitialize(const std::string& dbFilePath, bool isReadOnly)
     }
     COMMON_RETV_IF(dbFilePath.empty(), false);
     if (isReadOnly)
-        COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY) == false, false);
+        COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY) == false,
+                       false);
     else
-        COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE) == false,
+        COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READWRITE |
+                                                  SQLITE_OPEN_CREATE) == false,
                        false);
     COMMON_RETV_IF(DBSetBusyHandler() == false, false);
     COMMON_RETV_IF(DBExcutePerformanceOptimization() == false, false);
     COMMON_RETV_IF(DBStartTransaction() == false, false);
+    mIsCycleFailed = false;
     return true;
 }
 
-void DBConnector::DBFinalize()
+bool DBConnector::DBFinalize()
 {
-    COMMON_RET_IF(DBEndTransaction() == false);
+    COMMON_RETV_IF(DBEndTransaction() == false, false);
     if (!mDBHandle)
     {
         COMMON_LOG("mDBHandle is NULL");
-        return;
+        return false;
     }
     DBClose();
+    return true;
 }
 
 sqlite3_stmt* DBConnector::DBPrepareQuery(const char* query)
@@ -118,7 +132,8 @@ bool DBConnector::DBFileOpen(const std::string& dbFilePath, int openFlags)
     int rc = sqlite3_open_v2(dbFilePath.c_str(), &mDBHandle, openFlags, nullptr);
     if (rc != SQLITE_OK)
     {
-        COMMON_LOG("sqlite3_open_open failed. %d %p, %s", rc, static_cast<void*>(mDBHandle), dbFilePath.c_str());
+        COMMON_LOG("sqlite3_open_open failed. %d %p, %s", rc, static_cast<void*>(mDBHandle),
+                   dbFilePath.c_str());
         DBClose();
         return false;
     }
@@ -141,8 +156,9 @@ bool DBConnector::DBSetBusyHandler()
 bool DBConnector::DBExcutePerformanceOptimization()
 {
     char* errorMsg = nullptr;
-    int rc = sqlite3_exec(mDBHandle, "PRAGMA synchronous=OFF; PRAGMA count_changes=OFF; PRAGMA temp_store=memory;",
-                          nullptr, nullptr, &errorMsg);
+    int rc =
+        sqlite3_exec(mDBHandle, "PRAGMA synchronous=OFF; PRAGMA count_changes=OFF; PRAGMA temp_store=memory;",
+                     nullptr, nullptr, &errorMsg);
     if (rc != SQLITE_OK)
     {
         COMMON_LOG("Fail to sqlite3_exec for performance optimization.");
@@ -154,26 +170,41 @@ bool DBConnector::DBExcutePerformanceOptimization()
     return true;
 }
 
+// The immediate form takes the write lock at once (waiting through the busy
+// handler) instead of at the first write.
 bool DBConnector::DBStartTransaction()
 {
-    if (sqlite3_exec(mDBHandle, "BEGIN TRANSACTION;", nullptr, nullptr, nullptr) != SQLITE_OK)
+    const char* beginQuery = mIsImmediate ? "BEGIN IMMEDIATE TRANSACTION;" : "BEGIN TRANSACTION;";
+    int rc = sqlite3_exec(mDBHandle, beginQuery, nullptr, nullptr, nullptr);
+    if (rc != SQLITE_OK)
     {
         COMMON_LOG("sqlite3_exec fail");
+        COMMON_LOG("%s rc [%d][%s]", beginQuery, rc, sqlite3_errmsg(mDBHandle));
         DBClose();
         return false;
     }
     return true;
 }
 
-// A commit that fails (e.g. busy) is rolled back so that the handle is not
-// left open inside a transaction for the next cycle to inherit.
+// A cycle with a failed step, or whose commit fails (e.g. busy), is rolled
+// back: nothing of it is kept and the handle does not stay inside a
+// transaction for the next cycle to inherit.
 bool DBConnector::DBEndTransaction()
 {
     if (!mDBHandle)
         return true;
-    if (sqlite3_exec(mDBHandle, "END TRANSACTION;", nullptr, nullptr, nullptr) != SQLITE_OK)
+    if (mIsCycleFailed)
+    {
+        COMMON_LOG("A step of this cycle failed: rolled back");
+        sqlite3_exec(mDBHandle, "ROLLBACK;", nullptr, nullptr, nullptr);
+        DBClose();
+        return false;
+    }
+    int rc = sqlite3_exec(mDBHandle, "END TRANSACTION;", nullptr, nullptr, nullptr);
+    if (rc != SQLITE_OK)
     {
         COMMON_LOG("sqlite3_exec fail");
+        COMMON_LOG("END TRANSACTION rc [%d][%s]", rc, sqlite3_errmsg(mDBHandle));
         sqlite3_exec(mDBHandle, "ROLLBACK;", nullptr, nullptr, nullptr);
         DBClose();
         return false;

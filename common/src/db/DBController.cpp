@@ -8,7 +8,6 @@
 #include "CityDBController.h"
 #include "CommonLog.h"
 #include "CurrentWeatherDBController.h"
-#include "DBConnector.h"
 #include "DBCycleCloser.h"
 #include "ExtraWeatherDBController.h"
 #include "FileUtil.h"
@@ -16,6 +15,7 @@
 #include "MoonPhaseDBController.h"
 #include "SettingDBController.h"
 #include "WeatherDefine.h"
+#include "WeatherNewsIconDBController.h"
 #include "WeeklyWeatherDBController.h"
 
 namespace NSWeather
@@ -23,9 +23,17 @@ namespace NSWeather
 
 namespace
 {
+constexpr DBCycleCloser::Mode READ = DBCycleCloser::Mode::READ;
+constexpr DBCycleCloser::Mode WRITE = DBCycleCloser::Mode::WRITE;
+
 std::string GetWeatherDBFilePath()
 {
     return FileUtil::GetWeatherDBFilePath();
+}
+
+int ResultOf(DBCycleCloser& cycle, bool isDone)
+{
+    return cycle.Close(isDone) ? ERR_OK : ERR_FAIL;
 }
 
 template <typename T>
@@ -36,32 +44,18 @@ T FindOr(const std::map<int, T>& values, int key, T fallback)
 }
 }  // namespace
 
-// Opens the weather database for the rest of the calling operation (see
-// DBCycleCloser). A failed open is logged as that operation's own guard
-// line and returns failValue.
-#define WEATHER_DB_CYCLE_OR_RETURN(isReadOnly, failValue)                                             \
-    DBConnector* dbConnector = DBConnector::GetInstance();                                            \
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), isReadOnly) == false, failValue); \
-    DBCycleCloser cycle(dbConnector)
+DBController::DBController() {}
 
-DBController::DBController()
-{
-}
-
-DBController::~DBController()
-{
-}
+DBController::~DBController() {}
 
 int DBController::Initialize()
 {
-    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
-    CityDBController().CreateTable();
-    CurrentWeatherDBController().CreateTable();
-    WeeklyWeatherDBController().CreateTable();
-    HourlyWeatherDBController().CreateTable();
-    ExtraWeatherDBController().CreateTable();
-    MoonPhaseDBController().CreateTable();
-    return ERR_OK;
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
+    bool isDone = CityDBController().CreateTable() && CurrentWeatherDBController().CreateTable() &&
+                  WeeklyWeatherDBController().CreateTable() && HourlyWeatherDBController().CreateTable() &&
+                  ExtraWeatherDBController().CreateTable() && MoonPhaseDBController().CreateTable();
+    return ResultOf(cycle, isDone);
 }
 
 CityPtr DBController::SelectDataWithPrimaryKey(CityDBController& cityDBController, int primaryKey)
@@ -117,7 +111,8 @@ CityPtrVectorPtr DBController::SelectAllCities(CityDBController& cityDBControlle
         cityPtr->SetWeeklyPtrVector(FindOr(weeklyMap, primaryKey, std::make_shared<WeeklyPtrVector>()));
         cityPtr->SetHourlyPtrVector(FindOr(hourlyMap, primaryKey, std::make_shared<HourlyPtrVector>()));
         cityPtr->SetExtraPtr(FindOr(extraMap, primaryKey, ExtraPtr()));
-        cityPtr->SetMoonPhasePtrVector(FindOr(moonPhaseMap, primaryKey, std::make_shared<MoonPhasePtrVector>()));
+        cityPtr->SetMoonPhasePtrVector(
+            FindOr(moonPhaseMap, primaryKey, std::make_shared<MoonPhasePtrVector>()));
         cityPtrVector->push_back(cityPtr);
     }
     return cityPtrVector;
@@ -125,14 +120,16 @@ CityPtrVectorPtr DBController::SelectAllCities(CityDBController& cityDBControlle
 
 CityPtrVectorPtr DBController::SelectAllCityData()
 {
-    WEATHER_DB_CYCLE_OR_RETURN(true, nullptr);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), READ);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, nullptr);
     CityDBController cityDBController;
     return SelectAllCities(cityDBController);
 }
 
 CityPtr DBController::SelectCityData(int pageIndex)
 {
-    WEATHER_DB_CYCLE_OR_RETURN(true, nullptr);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), READ);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, nullptr);
     CityDBController cityDBController;
     return SelectDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(pageIndex));
 }
@@ -140,14 +137,16 @@ CityPtr DBController::SelectCityData(int pageIndex)
 CityPtr DBController::SelectCityData(const std::string& locationID)
 {
     COMMON_RETV_IF(locationID.length() < 1, nullptr);
-    WEATHER_DB_CYCLE_OR_RETURN(true, nullptr);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), READ);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, nullptr);
     CityDBController cityDBController;
     return SelectDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(locationID));
 }
 
 StringVectorPtr DBController::SelectAllLocationIDData()
 {
-    WEATHER_DB_CYCLE_OR_RETURN(true, nullptr);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), READ);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, nullptr);
     CityDBController cityDBController;
     StringVectorPtr locationIdVector = std::make_shared<StringVector>();
     int count = cityDBController.GetNumberOfCities();
@@ -158,7 +157,8 @@ StringVectorPtr DBController::SelectAllLocationIDData()
 
 StringVectorPtr DBController::SelectNeedToUpdateLocationIDData()
 {
-    WEATHER_DB_CYCLE_OR_RETURN(true, nullptr);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), READ);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, nullptr);
     CityDBController cityDBController;
     StringVectorPtr locationIdVector = std::make_shared<StringVector>();
     int count = cityDBController.GetNumberOfCities();
@@ -174,35 +174,40 @@ StringVectorPtr DBController::SelectNeedToUpdateLocationIDData()
 
 int DBController::GetNumberOfCities()
 {
-    WEATHER_DB_CYCLE_OR_RETURN(true, -1);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), READ);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, -1);
     return CityDBController().GetNumberOfCities();
 }
 
 int DBController::GetPageIndexOfCurrentCity()
 {
-    WEATHER_DB_CYCLE_OR_RETURN(true, -1);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), READ);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, -1);
     return CityDBController().GetPageIndexOfCurrentCity();
 }
 
 int DBController::GetPageIndexWithLocationID(const std::string& locationID)
 {
-    WEATHER_DB_CYCLE_OR_RETURN(true, -1);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), READ);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, -1);
     return CityDBController().GetPageIndexWithLocationID(locationID);
 }
 
 std::string DBController::GetLocationIdOfCurrentCity()
 {
-    WEATHER_DB_CYCLE_OR_RETURN(true, std::string());
+    DBCycleCloser cycle(GetWeatherDBFilePath(), READ);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, std::string());
     return CityDBController().GetLocationIdOfCurrentCity();
 }
 
 bool DBController::IsCurrentLocationExist()
 {
-    WEATHER_DB_CYCLE_OR_RETURN(true, false);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), READ);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, false);
     return CityDBController().IsCurrentLocationExist();
 }
 
-bool DBController::InsertIfNew(CityDBController& cityDBController, CityPtr cityPtr)
+DBController::InsertResult DBController::InsertIfNew(CityDBController& cityDBController, CityPtr cityPtr)
 {
     // Compared as it will be stored, so a current-location city is found
     // again once its id carries ":C".
@@ -215,33 +220,35 @@ bool DBController::InsertIfNew(CityDBController& cityDBController, CityPtr cityP
             row.second->GetIsCurrentLocation() == cityPtr->GetIsCurrentLocation())
         {
             COMMON_LOG("There is a same city in DB");
-            return false;
+            return InsertResult::ALREADY_STORED;
         }
     }
-    InsertDataWithCityPtr(cityDBController, cityPtr);
-    return true;
+    return InsertDataWithCityPtr(cityDBController, cityPtr) ? InsertResult::INSERTED : InsertResult::FAILED;
 }
 
-void DBController::InsertDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr)
+bool DBController::InsertDataWithCityPtr(CityDBController& cityDBController, CityPtr cityPtr)
 {
-    COMMON_RET_IF(!cityPtr);
+    COMMON_RETV_IF(!cityPtr, false);
     int count = cityDBController.GetNumberOfCities();
+    COMMON_RETV_IF(count < 0, false);
     if (count > cityPtr->GetPageIndex())
         cityPtr->SetPageIndex(count);
-    cityDBController.Insert(cityPtr);
+    COMMON_RETV_IF(cityDBController.Insert(cityPtr) == false, false);
     int primaryKey = cityDBController.GetLastInsertedPrimaryKey();
-    CurrentWeatherDBController().Insert(primaryKey, cityPtr->GetCurrentPtr());
-    WeeklyWeatherDBController().Insert(primaryKey, cityPtr->GetWeeklyPtrVector());
-    HourlyWeatherDBController().Insert(primaryKey, cityPtr->GetHourlyPtrVector());
-    ExtraWeatherDBController().Insert(primaryKey, cityPtr->GetExtraPtr());
+    COMMON_RETV_IF(primaryKey < 1, false);
+    return CurrentWeatherDBController().Insert(primaryKey, cityPtr->GetCurrentPtr()) &&
+           WeeklyWeatherDBController().Insert(primaryKey, cityPtr->GetWeeklyPtrVector()) &&
+           HourlyWeatherDBController().Insert(primaryKey, cityPtr->GetHourlyPtrVector()) &&
+           ExtraWeatherDBController().Insert(primaryKey, cityPtr->GetExtraPtr());
 }
 
 int DBController::InsertCityData(CityPtr cityPtr)
 {
     COMMON_RETV_IF(!cityPtr, ERR_FAIL);
-    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
     CityDBController cityDBController;
-    return InsertIfNew(cityDBController, cityPtr) ? ERR_OK : ERR_FAIL;
+    return ResultOf(cycle, InsertIfNew(cityDBController, cityPtr) == InsertResult::INSERTED);
 }
 
 int DBController::ResolvePrimaryKey(CityDBController& cityDBController, const CityPtr& cityPtr)
@@ -257,138 +264,147 @@ bool DBController::UpdateDataWithCityPtr(CityDBController& cityDBController, Cit
     int primaryKey = ResolvePrimaryKey(cityDBController, cityPtr);
     // Without a city row the forecast inserts below would leave orphan rows.
     COMMON_RETV_IF(primaryKey < 1, false);
-    cityDBController.Update(cityPtr, primaryKey);
-    CurrentWeatherDBController().Update(primaryKey, cityPtr->GetCurrentPtr());
-    WeeklyWeatherDBController().Update(primaryKey, cityPtr->GetWeeklyPtrVector());
     HourlyWeatherDBController hourlyDBController;
-    hourlyDBController.Delete(primaryKey);
-    hourlyDBController.Insert(primaryKey, cityPtr->GetHourlyPtrVector());
-    ExtraWeatherDBController().Update(primaryKey, cityPtr->GetExtraPtr());
-    return true;
+    return cityDBController.Update(cityPtr, primaryKey) &&
+           CurrentWeatherDBController().Update(primaryKey, cityPtr->GetCurrentPtr()) &&
+           WeeklyWeatherDBController().Update(primaryKey, cityPtr->GetWeeklyPtrVector()) &&
+           hourlyDBController.Delete(primaryKey) &&
+           hourlyDBController.Insert(primaryKey, cityPtr->GetHourlyPtrVector()) &&
+           ExtraWeatherDBController().Update(primaryKey, cityPtr->GetExtraPtr());
 }
 
 int DBController::UpdateCityData(CityPtr cityPtr)
 {
     COMMON_RETV_IF(!cityPtr, ERR_FAIL);
-    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
     CityDBController cityDBController;
-    return UpdateDataWithCityPtr(cityDBController, cityPtr) ? ERR_OK : ERR_FAIL;
+    return ResultOf(cycle, UpdateDataWithCityPtr(cityDBController, cityPtr));
 }
 
 int DBController::UpdateOnlyWidgetReferenceCount(const std::string& locationID, bool isIncrease)
 {
-    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
     CityDBController cityDBController;
     CityPtr cityPtr = cityDBController.Select(locationID);
     COMMON_RETV_IF(!cityPtr, ERR_FAIL);
     int count = cityPtr->GetWidgetReferenceCount();
     count = isIncrease ? count + 1 : std::max(count - 1, 0);
-    cityDBController.UpdateOnlyWidgetReferenceCount(locationID, count);
-    return ERR_OK;
+    return ResultOf(cycle, cityDBController.UpdateOnlyWidgetReferenceCount(locationID, count));
 }
 
 int DBController::UpdateOnlyMobileLink(CityPtr cityPtr)
 {
     COMMON_RETV_IF(!cityPtr, ERR_FAIL);
-    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
     CityDBController cityDBController;
     int primaryKey = ResolvePrimaryKey(cityDBController, cityPtr);
-    cityDBController.UpdateOnlyMobileLink(cityPtr, primaryKey);
-    return ERR_OK;
+    COMMON_RETV_IF(primaryKey < 1, ERR_FAIL);
+    return ResultOf(cycle, cityDBController.UpdateOnlyMobileLink(cityPtr, primaryKey));
 }
 
 int DBController::ReorderCityData(CityPtrVectorPtr reorderPtrVector)
 {
     COMMON_RETV_IF(!reorderPtrVector, ERR_FAIL);
-    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
-    CityDBController().Reorder(reorderPtrVector);
-    return ERR_OK;
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
+    return ResultOf(cycle, CityDBController().Reorder(reorderPtrVector));
 }
 
-void DBController::DeleteDataWithPrimaryKey(CityDBController& cityDBController, int primaryKey)
+bool DBController::DeleteDataWithPrimaryKey(CityDBController& cityDBController, int primaryKey)
 {
-    cityDBController.Delete(primaryKey);
-    CurrentWeatherDBController().Delete(primaryKey);
-    WeeklyWeatherDBController().Delete(primaryKey);
-    HourlyWeatherDBController().Delete(primaryKey);
-    ExtraWeatherDBController().Delete(primaryKey);
+    return cityDBController.Delete(primaryKey) && CurrentWeatherDBController().Delete(primaryKey) &&
+           WeeklyWeatherDBController().Delete(primaryKey) && HourlyWeatherDBController().Delete(primaryKey) &&
+           ExtraWeatherDBController().Delete(primaryKey);
 }
 
 int DBController::DeleteCityData(int pageIndex)
 {
-    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
     CityDBController cityDBController;
-    DeleteDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(pageIndex));
-    return ERR_OK;
+    return ResultOf(cycle,
+                    DeleteDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(pageIndex)));
 }
 
 int DBController::DeleteCityData(const std::string& locationID)
 {
-    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
     CityDBController cityDBController;
-    DeleteDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(locationID));
-    return ERR_OK;
+    return ResultOf(cycle,
+                    DeleteDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(locationID)));
 }
 
-void DBController::DeleteAll(CityDBController& cityDBController)
+bool DBController::DeleteAll(CityDBController& cityDBController)
 {
     COMMON_LOG("DeleteAllCityData");
-    cityDBController.DeleteAll();
-    CurrentWeatherDBController().DeleteAll();
-    WeeklyWeatherDBController().DeleteAll();
-    HourlyWeatherDBController().DeleteAll();
-    ExtraWeatherDBController().DeleteAll();
+    return cityDBController.DeleteAll() && CurrentWeatherDBController().DeleteAll() &&
+           WeeklyWeatherDBController().DeleteAll() && HourlyWeatherDBController().DeleteAll() &&
+           ExtraWeatherDBController().DeleteAll();
 }
 
 int DBController::DeleteAllCityData()
 {
-    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
     CityDBController cityDBController;
-    DeleteAll(cityDBController);
-    return ERR_OK;
+    return ResultOf(cycle, DeleteAll(cityDBController));
 }
 
 int DBController::DeleteAllCityDataAndInsertCityPtrVector(CityPtrVectorPtr cityPtrVector)
 {
-    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
     CityDBController cityDBController;
-    DeleteAll(cityDBController);
-    if (!cityPtrVector)
-        return ERR_OK;
-    for (const CityPtr& cityPtr : *cityPtrVector)
+    bool isDone = DeleteAll(cityDBController);
+    if (cityPtrVector)
     {
-        if (cityPtr)
-            InsertIfNew(cityDBController, cityPtr);
+        // A duplicate is left out; a failed insert undoes the whole change.
+        for (size_t i = 0; isDone && i < cityPtrVector->size(); ++i)
+        {
+            if ((*cityPtrVector)[i])
+                isDone = InsertIfNew(cityDBController, (*cityPtrVector)[i]) != InsertResult::FAILED;
+        }
     }
-    return ERR_OK;
+    return ResultOf(cycle, isDone);
 }
 
 int DBController::UpdateOnlyMoonPhaseData(CityPtr cityPtr)
 {
     COMMON_RETV_IF(!cityPtr, ERR_FAIL);
-    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
     CityDBController cityDBController;
     int primaryKey = ResolvePrimaryKey(cityDBController, cityPtr);
     COMMON_RETV_IF(primaryKey < 1, ERR_FAIL);
     MoonPhaseDBController moonPhaseDBController;
-    moonPhaseDBController.Delete(cityPtr->GetLocationId());
-    moonPhaseDBController.Insert(primaryKey, cityPtr->GetMoonPhasePtrVector());
-    return ERR_OK;
+    return ResultOf(cycle, moonPhaseDBController.Delete(cityPtr->GetLocationId()) &&
+                               moonPhaseDBController.Insert(primaryKey, cityPtr->GetMoonPhasePtrVector()));
 }
 
 int DBController::DeleteUselessMoonPhaseData()
 {
-    WEATHER_DB_CYCLE_OR_RETURN(false, ERR_FAIL);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
     CityDBController cityDBController;
     MoonPhaseDBController moonPhaseDBController;
     StringVector moonPhaseLocIdVector = moonPhaseDBController.SelectAllLocationId();
     COMMON_RETV_IF(moonPhaseLocIdVector.size() < 1, ERR_OK);
-    for (const std::string& locationId : moonPhaseLocIdVector)
+    bool isDone = true;
+    for (size_t i = 0; isDone && i < moonPhaseLocIdVector.size(); ++i)
     {
-        if (cityDBController.GetPageIndexWithLocationID(locationId) < 0)
-            moonPhaseDBController.Delete(locationId);
+        if (cityDBController.GetPageIndexWithLocationID(moonPhaseLocIdVector[i]) < 0)
+            isDone = moonPhaseDBController.Delete(moonPhaseLocIdVector[i]);
     }
-    return ERR_OK;
+    return ResultOf(cycle, isDone);
+}
+
+int DBController::GetWeatherNewsIcon(int iconId, bool isDayTime)
+{
+    return WeatherNewsIconDBController().Select(iconId, isDayTime);
 }
 
 bool DBController::GetIsWeatherInfoExpired()

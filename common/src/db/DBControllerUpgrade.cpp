@@ -1,7 +1,5 @@
 #include "DBController.h"
 
-#include <cstdio>
-#include <memory>
 #include <stdexcept>
 #include <string>
 
@@ -64,69 +62,32 @@ const UpgradeStep UPGRADE_STEPS[] = {
 };
 
 constexpr const char* CURRENT_LOCATION_SUFFIX = ":C";
-constexpr size_t ICON_QUERY_BUFFER_SIZE = 512;
 
 std::string GetWeatherDBFilePath()
 {
     return FileUtil::GetWeatherDBFilePath();
 }
 
-// Runs one step in a cycle of its own; false when the weather database
-// cannot be opened.
+// Runs one step in a cycle of its own. A step refused as such (the column
+// is already there, the table already gone) is skipped; false when the
+// database cannot be opened or written (busy, full, read-only).
 bool RunUpgradeStep(const UpgradeStep& step)
 {
     COMMON_LOG("%s : %s", step.logLabel, step.query);
+    DBCycleCloser cycle(GetWeatherDBFilePath(), DBCycleCloser::Mode::WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, false);
     DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false, false);
-    DBCycleCloser cycle(dbConnector);
-    dbConnector->DBExecuteQuery(step.query);
-    return true;
-}
-
-struct SqliteCloser
-{
-    void operator()(sqlite3* handle) const { sqlite3_close_v2(handle); }
-};
-
-struct StatementFinalizer
-{
-    void operator()(sqlite3_stmt* stmt) const { sqlite3_finalize(stmt); }
-};
-
-// The widget icon for one provider number from the icon database; 0 when
-// the number is not listed or the file has no usable table.
-int SelectMappedIcon(sqlite3* handle, int iconId, bool isDayTime)
-{
-    char query[ICON_QUERY_BUFFER_SIZE] = {};
-    snprintf(query, sizeof(query),
-             isDayTime ? "SELECT day_mapping_id FROM icon_table WHERE icon_id = %d;"
-                       : "SELECT night_mapping_id FROM icon_table WHERE icon_id = %d;",
-             iconId);
-    sqlite3_stmt* rawStmt = nullptr;
-    int rc = sqlite3_prepare_v2(handle, query, -1, &rawStmt, nullptr);
-    std::unique_ptr<sqlite3_stmt, StatementFinalizer> stmt(rawStmt);
-    if (rc != SQLITE_OK)
-    {
-        COMMON_LOG("Fail: sqlite3_prepare_v2 Failed rc [%d][%s]", rc, sqlite3_errmsg(handle));
-        COMMON_LOG("Query: %s", query);
-        return 0;
-    }
-    rc = sqlite3_step(stmt.get());
-    if (rc != SQLITE_ROW)
-    {
-        COMMON_LOG("No result : %d", rc);
-        return 0;
-    }
-    return sqlite3_column_int(stmt.get(), 0);
+    bool isDone = dbConnector->DBExecuteQuery(step.query) || dbConnector->GetLastErrorCode() == SQLITE_ERROR;
+    return cycle.Close(isDone);
 }
 
 // The current-location city used to be stored under the provider's bare
 // key; it now carries ":C" so that it never collides with the same city
 // added by hand.
-void MigrateCurrentLocationId(DBController& dbController)
+bool MigrateCurrentLocationId(DBController& dbController)
 {
     CityPtrVectorPtr cityPtrVector = dbController.SelectAllCityData();
-    COMMON_RET_IF(!cityPtrVector);
+    COMMON_RETV_IF(!cityPtrVector, false);
     try
     {
         for (size_t i = 0; i < cityPtrVector->size(); ++i)
@@ -138,7 +99,7 @@ void MigrateCurrentLocationId(DBController& dbController)
             if (locationId.find(CURRENT_LOCATION_SUFFIX) == std::string::npos)
             {
                 cityPtr->SetLocationId(locationId + CURRENT_LOCATION_SUFFIX);
-                dbController.UpdateCityData(cityPtr);
+                return dbController.UpdateCityData(cityPtr) == ERR_OK;
             }
             break;
         }
@@ -153,6 +114,7 @@ void MigrateCurrentLocationId(DBController& dbController)
         COMMON_LOG("exception caught: %s", e.what());
         COMMON_LOG("[%s]", e.what());
     }
+    return true;
 }
 
 }  // namespace
@@ -170,29 +132,10 @@ int DBController::UpgradeDB(double currentVersion)
             continue;
         if (RunUpgradeStep(step) == false)
             return ERR_FAIL;
-        if (step.migratesCurrentLocation)
-            MigrateCurrentLocationId(*this);
+        if (step.migratesCurrentLocation && MigrateCurrentLocationId(*this) == false)
+            return ERR_FAIL;
     }
     return ERR_OK;
-}
-
-int DBController::GetWeatherNewsIcon(int iconId, bool isDayTime)
-{
-    std::string iconDBPath = FileUtil::GetWeatherNewsIconDBFilePath();
-    COMMON_RETV_IF(iconDBPath.length() < 1, 0);
-
-    // Shipped with the program: read-only, so a missing file is reported
-    // instead of an empty database being created in the resource folder.
-    sqlite3* rawHandle = nullptr;
-    int rc = sqlite3_open_v2(iconDBPath.c_str(), &rawHandle, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY,
-                             nullptr);
-    std::unique_ptr<sqlite3, SqliteCloser> handle(rawHandle);
-    if (rc != SQLITE_OK)
-    {
-        COMMON_LOG("sqlite3_open_open failed. %d %p", rc, static_cast<void*>(rawHandle));
-        return 0;
-    }
-    return SelectMappedIcon(handle.get(), iconId, isDayTime);
 }
 
 }  // namespace NSWeather

@@ -2,6 +2,7 @@
 
 #include <cmath>
 
+#include "CommonLog.h"
 #include "DBConnector.h"
 
 namespace NSWeather
@@ -35,9 +36,8 @@ bool DBStatement::BindDouble(int index, double value)
 
 bool DBStatement::BindText(int index, const std::string& value)
 {
-    return mStmt &&
-           sqlite3_bind_text(mStmt, index, value.c_str(), static_cast<int>(value.size()), SQLITE_TRANSIENT) ==
-               SQLITE_OK;
+    return mStmt && sqlite3_bind_text(mStmt, index, value.c_str(), static_cast<int>(value.size()),
+                                      SQLITE_TRANSIENT) == SQLITE_OK;
 }
 
 bool DBStatement::BindTemperature(int index, const TemperaturePtr& temperature)
@@ -50,7 +50,26 @@ int DBStatement::Step()
 {
     if (!mStmt)
         return SQLITE_MISUSE;
-    return sqlite3_step(mStmt);
+    int rc = sqlite3_step(mStmt);
+    if (rc != SQLITE_ROW && rc != SQLITE_DONE)
+    {
+        sqlite3* handle = sqlite3_db_handle(mStmt);
+        COMMON_LOG("Fail: sqlite3_step rc [%d][%s]", rc, sqlite3_errmsg(handle));
+        COMMON_LOG("Query: %s", sqlite3_sql(mStmt));
+        DBConnector::GetInstance()->MarkCycleFailed();
+    }
+    return rc;
+}
+
+bool DBStatement::Execute()
+{
+    if (!mStmt)
+    {
+        // The prepare failure is already logged.
+        DBConnector::GetInstance()->MarkCycleFailed();
+        return false;
+    }
+    return Step() == SQLITE_DONE;
 }
 
 void DBStatement::Reset()

@@ -16,7 +16,8 @@ const char* const ExtraWeatherDBController::CREATE_TABLE_FORMAT =
     "outdoorExcercise\tINTEGER,comfort\t\t\tINTEGER,clothing\t\t\tINTEGER,skincare\t\t\tINTEGER,"
     "carwash\t\t\tINTEGER,foodPoison\t\t\tINTEGER,heat\t\t\t\tINTEGER,spoiledFood\t\tINTEGER,"
     "discomfort\t\t\tINTEGER,frozenPipes\t\tINTEGER,frostbite\t\t\tINTEGER,cold\t\t\t\tINTEGER,"
-    "pollen\t\t\t\tINTEGER,airDust\t\t\tINTEGER,drySkin\t\t\tINTEGER,realfeel\t\t\tDOUBLE,precType\t\t\tINTEGER,"
+    "pollen\t\t\t\tINTEGER,airDust\t\t\tINTEGER,drySkin\t\t\tINTEGER,realfeel\t\t\tDOUBLE,"
+    "precType\t\t\tINTEGER,"
     "precProbability\tDOUBLE,precAmount\t\t\tDOUBLE,precProbabilityNight\tDOUBLE,precAmountNight\t\t\tDOUBLE,"
     "FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON UPDATE CASCADE);";
 
@@ -24,18 +25,22 @@ namespace
 {
 const char* const INSERT_COLUMNS =
     "FK_ID,humidity,sunsetTime,sunriseTime,pm25,pm10,aqi,uvIndex,outdoorExcercise,comfort,clothing,skincare,"
-    "carwash,foodPoison,heat,spoiledFood,discomfort,frozenPipes,frostbite,cold,pollen,airDust,drySkin,realfeel,"
+    "carwash,foodPoison,heat,spoiledFood,discomfort,frozenPipes,frostbite,cold,pollen,airDust,drySkin,"
+    "realfeel,"
     "precType,precProbability,precAmount,precProbabilityNight,precAmountNight";
 const char* const INSERT_PLACEHOLDERS =
     "?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?, ?";
 const char* const UPDATE_ASSIGNMENTS =
     "humidity = ?,sunsetTime = ?,sunriseTime = ?,pm25 = ?,pm10 = ?,aqi = ?,uvIndex = ?,outdoorExcercise = ?,"
-    "comfort = ?,clothing = ?,skincare = ?,carwash = ?,foodPoison = ?,heat = ?,spoiledFood = ?,discomfort = ?,"
+    "comfort = ?,clothing = ?,skincare = ?,carwash = ?,foodPoison = ?,heat = ?,spoiledFood = ?,discomfort = "
+    "?,"
     "frozenPipes = ?,frostbite = ?,cold = ?,pollen = ?,airDust = ?,drySkin = ?,realfeel = ?,precType = ?,"
     "precProbability = ?,precAmount = ?,precProbabilityNight = ?,precAmountNight = ?";
 const char* const SELECT_COLUMNS =
-    "humidity,sunsetTime,sunriseTime,pm25,pm10,aqi,uvIndex,outdoorExcercise,comfort,clothing,skincare,carwash,"
-    "foodPoison,heat,spoiledFood,discomfort,frozenPipes,frostbite,cold,pollen,airDust,drySkin,realfeel,precType,"
+    "humidity,sunsetTime,sunriseTime,pm25,pm10,aqi,uvIndex,outdoorExcercise,comfort,clothing,skincare,"
+    "carwash,"
+    "foodPoison,heat,spoiledFood,discomfort,frozenPipes,frostbite,cold,pollen,airDust,drySkin,realfeel,"
+    "precType,"
     "precProbability,precAmount,precProbabilityNight,precAmountNight";
 
 int BindValues(DBStatement& stmt, int i, const ExtraPtr& extraPtr)
@@ -43,15 +48,26 @@ int BindValues(DBStatement& stmt, int i, const ExtraPtr& extraPtr)
     stmt.BindInt(i++, extraPtr->GetHumidity());
     stmt.BindInt64(i++, static_cast<int64_t>(extraPtr->GetSunsetTime()));
     stmt.BindInt64(i++, static_cast<int64_t>(extraPtr->GetSunriseTime()));
-    const int indexes[] = {extraPtr->GetPm25(),        extraPtr->GetPm10(),         extraPtr->GetAqi(),
-                           extraPtr->GetUvIndex(),     extraPtr->GetOutdoorExcercise(), extraPtr->GetComfort(),
-                           extraPtr->GetClothing(),    extraPtr->GetSkincare(),     extraPtr->GetCarwash(),
-                           extraPtr->GetFoodPoison(),  extraPtr->GetHeat(),         extraPtr->GetSpoiledFood(),
-                           extraPtr->GetDiscomfort(),  extraPtr->GetFrozenPipes(),  extraPtr->GetFrostbite(),
-                           extraPtr->GetCold(),        extraPtr->GetPollen(),       extraPtr->GetAirDust(),
+    const int indexes[] = {extraPtr->GetPm25(),
+                           extraPtr->GetPm10(),
+                           extraPtr->GetAqi(),
+                           extraPtr->GetUvIndex(),
+                           extraPtr->GetOutdoorExcercise(),
+                           extraPtr->GetComfort(),
+                           extraPtr->GetClothing(),
+                           extraPtr->GetSkincare(),
+                           extraPtr->GetCarwash(),
+                           extraPtr->GetFoodPoison(),
+                           extraPtr->GetHeat(),
+                           extraPtr->GetSpoiledFood(),
+                           extraPtr->GetDiscomfort(),
+                           extraPtr->GetFrozenPipes(),
+                           extraPtr->GetFrostbite(),
+                           extraPtr->GetCold(),
+                           extraPtr->GetPollen(),
+                           extraPtr->GetAirDust(),
                            extraPtr->GetDrySkin()};
-    for (int value : indexes)
-        stmt.BindInt(i++, value);
+    for (int value : indexes) stmt.BindInt(i++, value);
     stmt.BindTemperature(i++, extraPtr->GetRealfeel());
     PrecipitationPtr precipitationPtr = extraPtr->GetPrecipitationPtr();
     if (!precipitationPtr)
@@ -102,49 +118,47 @@ ExtraPtr ReadExtra(const DBStatement& stmt)
 }
 }  // namespace
 
-ExtraWeatherDBController::ExtraWeatherDBController()
+ExtraWeatherDBController::ExtraWeatherDBController() {}
+
+ExtraWeatherDBController::~ExtraWeatherDBController() {}
+
+bool ExtraWeatherDBController::CreateTable()
 {
+    return TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
 }
 
-ExtraWeatherDBController::~ExtraWeatherDBController()
+bool ExtraWeatherDBController::DeleteAll()
 {
+    return TableQuery::DeleteAll(TABLE_NAME);
 }
 
-void ExtraWeatherDBController::CreateTable()
+bool ExtraWeatherDBController::Delete(int foreignKey)
 {
-    TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
+    return TableQuery::Delete(TABLE_NAME, foreignKey);
 }
 
-void ExtraWeatherDBController::DeleteAll()
+bool ExtraWeatherDBController::Insert(int foreignKey, ExtraPtr extraPtr)
 {
-    TableQuery::DeleteAll(TABLE_NAME);
+    COMMON_RETV_IF(!extraPtr, true);
+    return TableQuery::InsertRecord(
+        mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS), foreignKey,
+        extraPtr, BindValues);
 }
 
-void ExtraWeatherDBController::Delete(int foreignKey)
+bool ExtraWeatherDBController::Update(int foreignKey, ExtraPtr extraPtr)
 {
-    TableQuery::Delete(TABLE_NAME, foreignKey);
-}
-
-void ExtraWeatherDBController::Insert(int foreignKey, ExtraPtr extraPtr)
-{
-    COMMON_RET_IF(!extraPtr);
-    TableQuery::InsertRecord(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS),
-                             foreignKey, extraPtr, BindValues);
-}
-
-void ExtraWeatherDBController::Update(int foreignKey, ExtraPtr extraPtr)
-{
-    COMMON_RET_IF(!extraPtr);
-    TableQuery::UpdateRecord(mQueryGenernator.MakeUpdateQuery(TABLE_NAME, UPDATE_ASSIGNMENTS,
-                                                              mQueryGenernator.MakeWhereClause("FK_ID = ?")),
-                             foreignKey, extraPtr, BindValues);
+    COMMON_RETV_IF(!extraPtr, true);
+    return TableQuery::UpdateRecord(
+        mQueryGenernator.MakeUpdateQuery(TABLE_NAME, UPDATE_ASSIGNMENTS,
+                                         mQueryGenernator.MakeWhereClause("FK_ID = ?")),
+        foreignKey, extraPtr, BindValues);
 }
 
 ExtraPtr ExtraWeatherDBController::Select(int foreignKey)
 {
-    return TableQuery::Select(
-        mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS, mQueryGenernator.MakeWhereClause("FK_ID = ?")),
-        foreignKey, ReadExtra);
+    return TableQuery::Select(mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS,
+                                                               mQueryGenernator.MakeWhereClause("FK_ID = ?")),
+                              foreignKey, ReadExtra);
 }
 
 std::map<int, ExtraPtr> ExtraWeatherDBController::SelectAll()

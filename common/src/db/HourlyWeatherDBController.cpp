@@ -13,13 +13,15 @@ const char* const HourlyWeatherDBController::TABLE_NAME = "HOURLY_WEATHER_TABLE"
 const char* const HourlyWeatherDBController::CREATE_TABLE_FORMAT =
     "CREATE TABLE IF NOT EXISTS %s (FK_ID\t\t\t\tINTEGER,hourlyIndex\t\tINTEGER,hour\t\t\t\tINT64,"
     "weatherIcon\t\tINTEGER,weatherStatus\t\tTEXT,curTemperature\t\tDOUBLE,lowTemperature\t\tDOUBLE,"
-    "highTemperature\tDOUBLE,websiteUrl\t\t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE "
+    "highTemperature\tDOUBLE,websiteUrl\t\t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE "
+    "CASCADE "
     "ON UPDATE CASCADE);";
 
 namespace
 {
 const char* const INSERT_COLUMNS =
-    "FK_ID,hourlyIndex,hour,weatherIcon,weatherStatus,curTemperature,lowTemperature,highTemperature,websiteUrl";
+    "FK_ID,hourlyIndex,hour,weatherIcon,weatherStatus,curTemperature,lowTemperature,highTemperature,"
+    "websiteUrl";
 const char* const INSERT_PLACEHOLDERS = "?, ?, ?, ?, ?, ?, ?, ?, ?";
 const char* const UPDATE_ASSIGNMENTS =
     "hour = ?,weatherIcon = ?,weatherStatus = ?,curTemperature = ?,lowTemperature = ?,highTemperature = ?,"
@@ -53,49 +55,47 @@ HourlyPtr ReadHourly(const DBStatement& stmt)
 }
 }  // namespace
 
-HourlyWeatherDBController::HourlyWeatherDBController()
+HourlyWeatherDBController::HourlyWeatherDBController() {}
+
+HourlyWeatherDBController::~HourlyWeatherDBController() {}
+
+bool HourlyWeatherDBController::CreateTable()
 {
+    return TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
 }
 
-HourlyWeatherDBController::~HourlyWeatherDBController()
+bool HourlyWeatherDBController::DeleteAll()
 {
+    return TableQuery::DeleteAll(TABLE_NAME);
 }
 
-void HourlyWeatherDBController::CreateTable()
+bool HourlyWeatherDBController::Delete(int foreignKey)
 {
-    TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
+    return TableQuery::Delete(TABLE_NAME, foreignKey);
 }
 
-void HourlyWeatherDBController::DeleteAll()
+bool HourlyWeatherDBController::Insert(int foreignKey, HourlyPtrVectorPtr hourlyPtrVector)
 {
-    TableQuery::DeleteAll(TABLE_NAME);
+    COMMON_RETV_IF(!hourlyPtrVector, true);
+    return TableQuery::InsertList(
+        mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS), foreignKey,
+        *hourlyPtrVector, BindValues);
 }
 
-void HourlyWeatherDBController::Delete(int foreignKey)
+bool HourlyWeatherDBController::Update(int foreignKey, HourlyPtrVectorPtr hourlyPtrVector)
 {
-    TableQuery::Delete(TABLE_NAME, foreignKey);
-}
-
-void HourlyWeatherDBController::Insert(int foreignKey, HourlyPtrVectorPtr hourlyPtrVector)
-{
-    COMMON_RET_IF(!hourlyPtrVector);
-    TableQuery::InsertList(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS),
-                           foreignKey, *hourlyPtrVector, BindValues);
-}
-
-void HourlyWeatherDBController::Update(int foreignKey, HourlyPtrVectorPtr hourlyPtrVector)
-{
-    COMMON_RET_IF(!hourlyPtrVector);
-    TableQuery::UpdateList(mQueryGenernator.MakeUpdateQuery(
-                               TABLE_NAME, UPDATE_ASSIGNMENTS,
-                               mQueryGenernator.MakeWhereClause("FK_ID = ? AND hourlyIndex = ?;")),
-                           foreignKey, *hourlyPtrVector, BindValues);
+    COMMON_RETV_IF(!hourlyPtrVector, true);
+    return TableQuery::UpdateList(
+        mQueryGenernator.MakeUpdateQuery(TABLE_NAME, UPDATE_ASSIGNMENTS,
+                                         mQueryGenernator.MakeWhereClause("FK_ID = ? AND hourlyIndex = ?;")),
+        foreignKey, *hourlyPtrVector, BindValues);
 }
 
 HourlyPtrVectorPtr HourlyWeatherDBController::Select(int foreignKey)
 {
     return TableQuery::SelectList(
-        mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS, mQueryGenernator.MakeWhereClause("FK_ID = ?")),
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS,
+                                         mQueryGenernator.MakeWhereClause("FK_ID = ?")),
         foreignKey, ReadHourly);
 }
 

@@ -15,7 +15,8 @@ const char* const MoonPhaseDBController::CREATE_TABLE_FORMAT =
 
 namespace
 {
-const char* const INSERT_COLUMNS = "FK_ID,moonPhaseIndex,locationID,date,moonRiseTime,moonSetTime,phaseText,age";
+const char* const INSERT_COLUMNS =
+    "FK_ID,moonPhaseIndex,locationID,date,moonRiseTime,moonSetTime,phaseText,age";
 const char* const INSERT_PLACEHOLDERS = "?, ?, ?, ?, ?, ?, ?, ?";
 const char* const UPDATE_ASSIGNMENTS =
     "locationID = ?,date = ?,moonRiseTime = ?,moonSetTime = ?,phaseText = ?,age = ?";
@@ -45,67 +46,66 @@ MoonPhasePtr ReadMoonPhase(const DBStatement& stmt)
 }
 }  // namespace
 
-MoonPhaseDBController::MoonPhaseDBController()
+MoonPhaseDBController::MoonPhaseDBController() {}
+
+MoonPhaseDBController::~MoonPhaseDBController() {}
+
+bool MoonPhaseDBController::CreateTable()
 {
+    return TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
 }
 
-MoonPhaseDBController::~MoonPhaseDBController()
+bool MoonPhaseDBController::DeleteAll()
 {
+    return TableQuery::DeleteAll(TABLE_NAME);
 }
 
-void MoonPhaseDBController::CreateTable()
+bool MoonPhaseDBController::Delete(int foreignKey)
 {
-    TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
+    return TableQuery::Delete(TABLE_NAME, foreignKey);
 }
 
-void MoonPhaseDBController::DeleteAll()
-{
-    TableQuery::DeleteAll(TABLE_NAME);
-}
-
-void MoonPhaseDBController::Delete(int foreignKey)
-{
-    TableQuery::Delete(TABLE_NAME, foreignKey);
-}
-
-void MoonPhaseDBController::Delete(const std::string& locationId)
+bool MoonPhaseDBController::Delete(const std::string& locationId)
 {
     DBStatement stmt(std::string("DELETE FROM ") + TABLE_NAME + " WHERE locationID = ?;");
     stmt.BindText(1, locationId);
-    if (stmt.Step() != SQLITE_DONE)
-        COMMON_LOG("Fail to Delete");
+    if (stmt.Execute())
+        return true;
+    COMMON_LOG("Fail to Delete");
+    return false;
 }
 
-void MoonPhaseDBController::Insert(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector)
+bool MoonPhaseDBController::Insert(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector)
 {
-    COMMON_RET_IF(!moonPhasePtrVector);
-    TableQuery::InsertList(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS),
-                           foreignKey, *moonPhasePtrVector, BindValues);
+    COMMON_RETV_IF(!moonPhasePtrVector, true);
+    return TableQuery::InsertList(
+        mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS), foreignKey,
+        *moonPhasePtrVector, BindValues);
 }
 
-void MoonPhaseDBController::Update(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector)
+bool MoonPhaseDBController::Update(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector)
 {
-    COMMON_RET_IF(!moonPhasePtrVector);
-    TableQuery::UpdateList(mQueryGenernator.MakeUpdateQuery(
-                               TABLE_NAME, UPDATE_ASSIGNMENTS,
-                               mQueryGenernator.MakeWhereClause("FK_ID = ? AND moonPhaseIndex = ?;")),
-                           foreignKey, *moonPhasePtrVector, BindValues);
+    COMMON_RETV_IF(!moonPhasePtrVector, true);
+    return TableQuery::UpdateList(mQueryGenernator.MakeUpdateQuery(
+                                      TABLE_NAME, UPDATE_ASSIGNMENTS,
+                                      mQueryGenernator.MakeWhereClause("FK_ID = ? AND moonPhaseIndex = ?;")),
+                                  foreignKey, *moonPhasePtrVector, BindValues);
 }
 
 MoonPhasePtrVectorPtr MoonPhaseDBController::Select(int foreignKey)
 {
     return TableQuery::SelectList(
-        mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS, mQueryGenernator.MakeWhereClause("FK_ID = ?")),
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS,
+                                         mQueryGenernator.MakeWhereClause("FK_ID = ?")),
         foreignKey, ReadMoonPhase);
 }
 
 std::vector<std::string> MoonPhaseDBController::SelectAllLocationId()
 {
     std::vector<std::string> retStringVector;
-    DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, "locationID",
-                                                      mQueryGenernator.MakeWhereClause("moonPhaseIndex = 0")));
-    while (stmt.Step() == SQLITE_ROW)
-        retStringVector.push_back(stmt.ColumnText(0));
+    DBStatement stmt(mQueryGenernator.MakeSelectQuery(
+        TABLE_NAME, "locationID", mQueryGenernator.MakeWhereClause("moonPhaseIndex = 0")));
+    while (stmt.Step() == SQLITE_ROW) retStringVector.push_back(stmt.ColumnText(0));
     if (retStringVector.size() < 1)
         COMMON_LOG("retStringVector.size() < 1");
     return retStringVector;
@@ -114,7 +114,8 @@ std::vector<std::string> MoonPhaseDBController::SelectAllLocationId()
 std::map<int, MoonPhasePtrVectorPtr> MoonPhaseDBController::SelectAll()
 {
     return TableQuery::SelectAllLists(
-        mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"), 6, ReadMoonPhase);
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(SELECT_COLUMNS) + ",FK_ID"), 6,
+        ReadMoonPhase);
 }
 
 }  // namespace NSWeather

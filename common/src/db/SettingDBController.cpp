@@ -1,10 +1,10 @@
 #include "SettingDBController.h"
 
 #include "CommonLog.h"
-#include "DBConnector.h"
 #include "DBCycleCloser.h"
 #include "DBStatement.h"
 #include "FileUtil.h"
+#include "QueryGenernator.h"
 #include "TableQuery.h"
 #include "WeatherDefine.h"
 
@@ -63,19 +63,14 @@ SettingDBController::~SettingDBController() = default;
 
 int SettingDBController::Initialize()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetSettingDBFilePath(), false) == false, ERR_FAIL);
-    bool hasRow = IsSettingTableExist();
-    if (hasRow == false)
-    {
-        CreateTable();
-        Insert(std::make_shared<Setting>());
-        // A file that is no database (or a foreign table) takes no row;
-        // say so instead of reporting a settings row that is not there.
-        hasRow = IsSettingTableExist();
-    }
-    dbConnector->DBFinalize();
-    COMMON_RETV_IF(hasRow == false, ERR_FAIL);
+    DBCycleCloser cycle(GetSettingDBFilePath(), DBCycleCloser::Mode::WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
+    if (IsSettingTableExist())
+        return ERR_OK;
+    // A foreign table of that name takes no row; say so instead of
+    // reporting a settings row that is not there.
+    bool hasRow = CreateTable() && Insert(std::make_shared<Setting>()) == ERR_OK && IsSettingTableExist();
+    COMMON_RETV_IF(cycle.Close(hasRow) == false, ERR_FAIL);
     return ERR_OK;
 }
 
@@ -84,54 +79,73 @@ bool SettingDBController::IsSettingTableExist()
     return TableQuery::IsTableExist(SETTING_TABLE);
 }
 
-void SettingDBController::CreateTable()
+bool SettingDBController::CreateTable()
 {
-    TableQuery::CreateTable(SETTING_CREATE_FORMAT, SETTING_TABLE);
+    return TableQuery::CreateTable(SETTING_CREATE_FORMAT, SETTING_TABLE);
 }
 
-void SettingDBController::Insert(const SettingPtr& settingPtr)
+int SettingDBController::Insert(const SettingPtr& settingPtr)
 {
-    COMMON_RET_IF(!settingPtr);
+    COMMON_RETV_IF(!settingPtr, ERR_FAIL);
     DBStatement statement(
-        mQueryGenernator.MakeInsertQuery(SETTING_TABLE, SETTING_COLUMNS, SETTING_PLACEHOLDERS));
+        QueryGenernator().MakeInsertQuery(SETTING_TABLE, SETTING_COLUMNS, SETTING_PLACEHOLDERS));
     BindSetting(statement, settingPtr);
-    statement.Step();
+    return statement.Execute() ? ERR_OK : ERR_FAIL;
 }
 
-void SettingDBController::Update(const SettingPtr& settingPtr)
+int SettingDBController::Update(const SettingPtr& settingPtr)
 {
-    COMMON_RET_IF(!settingPtr);
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RET_IF(dbConnector->DBInitialize(GetSettingDBFilePath(), false) == false);
-    DBCycleCloser cycle(dbConnector);
-    DBStatement statement(mQueryGenernator.MakeUpdateQuery(SETTING_TABLE, SETTING_ASSIGNMENTS));
-    BindSetting(statement, settingPtr);
-    statement.Step();
+    COMMON_RETV_IF(!settingPtr, ERR_FAIL);
+    DBCycleCloser cycle(GetSettingDBFilePath(), DBCycleCloser::Mode::WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
+    return cycle.Close(UpdateRow(settingPtr)) ? ERR_OK : ERR_FAIL;
 }
 
-void SettingDBController::UpdateLocationIdOfDisplayCity(const std::string& locationId)
+int SettingDBController::UpdateLocationIdOfDisplayCity(const std::string& locationId)
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RET_IF(dbConnector->DBInitialize(GetSettingDBFilePath(), false) == false);
-    DBCycleCloser cycle(dbConnector);
-    DBStatement statement(mQueryGenernator.MakeUpdateQuery(SETTING_TABLE, "CurrentCityLocationId = ?"));
-    statement.BindText(1, locationId);
-    statement.Step();
+    DBCycleCloser cycle(GetSettingDBFilePath(), DBCycleCloser::Mode::WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
+    bool isDone = false;
+    {
+        DBStatement statement(QueryGenernator().MakeUpdateQuery(SETTING_TABLE, "CurrentCityLocationId = ?"));
+        statement.BindText(1, locationId);
+        isDone = statement.Execute();
+    }
+    return cycle.Close(isDone) ? ERR_OK : ERR_FAIL;
 }
 
 SettingPtr SettingDBController::Select()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetSettingDBFilePath(), true) == false, nullptr);
-    DBCycleCloser cycle(dbConnector);
+    DBCycleCloser cycle(GetSettingDBFilePath(), DBCycleCloser::Mode::READ);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, nullptr);
     return SelectRow();
+}
+
+SettingPtr SettingDBController::SelectAndUpdate(const std::function<void(const SettingPtr&)>& change)
+{
+    COMMON_RETV_IF(!change, nullptr);
+    DBCycleCloser cycle(GetSettingDBFilePath(), DBCycleCloser::Mode::WRITE_IMMEDIATE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, nullptr);
+    SettingPtr settingPtr = SelectRow();
+    COMMON_RETV_IF(!settingPtr, nullptr);
+    change(settingPtr);
+    COMMON_RETV_IF(UpdateRow(settingPtr) == false, nullptr);
+    COMMON_RETV_IF(cycle.Close() == false, nullptr);
+    return settingPtr;
 }
 
 void SettingDBController::UpgradeDB(double /*currentVersion*/) {}
 
+bool SettingDBController::UpdateRow(const SettingPtr& settingPtr)
+{
+    DBStatement statement(QueryGenernator().MakeUpdateQuery(SETTING_TABLE, SETTING_ASSIGNMENTS));
+    BindSetting(statement, settingPtr);
+    return statement.Execute();
+}
+
 SettingPtr SettingDBController::SelectRow()
 {
-    DBStatement statement(mQueryGenernator.MakeSelectQuery(SETTING_TABLE, SETTING_COLUMNS));
+    DBStatement statement(QueryGenernator().MakeSelectQuery(SETTING_TABLE, SETTING_COLUMNS));
     int result = statement.Step();
     if (result != SQLITE_ROW)
     {

@@ -1,10 +1,10 @@
 #include "ShareTargetDBController.h"
 
 #include "CommonLog.h"
-#include "DBConnector.h"
 #include "DBCycleCloser.h"
 #include "DBStatement.h"
 #include "FileUtil.h"
+#include "QueryGenernator.h"
 #include "TableQuery.h"
 #include "WeatherDefine.h"
 
@@ -33,12 +33,10 @@ ShareTargetDBController::~ShareTargetDBController() = default;
 
 int ShareTargetDBController::Initialize()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetShareTargetDataDBFilePath(), false) == false, ERR_FAIL);
-    DBCycleCloser cycle(dbConnector);
-    if (IsShareTargetTableExist() == false)
-        CreateTable();
-    return ERR_OK;
+    DBCycleCloser cycle(GetShareTargetDataDBFilePath(), DBCycleCloser::Mode::WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
+    bool isDone = IsShareTargetTableExist() || CreateTable();
+    return cycle.Close(isDone) ? ERR_OK : ERR_FAIL;
 }
 
 bool ShareTargetDBController::IsShareTargetTableExist()
@@ -46,17 +44,16 @@ bool ShareTargetDBController::IsShareTargetTableExist()
     return TableQuery::IsTableExist(SHARE_TARGET_TABLE);
 }
 
-void ShareTargetDBController::CreateTable()
+bool ShareTargetDBController::CreateTable()
 {
-    TableQuery::CreateTable(SHARE_TARGET_CREATE_FORMAT, SHARE_TARGET_TABLE);
+    return TableQuery::CreateTable(SHARE_TARGET_CREATE_FORMAT, SHARE_TARGET_TABLE);
 }
 
-void ShareTargetDBController::Insert(const ShareTargetPtr& shareTargetPtr)
+int ShareTargetDBController::Insert(const ShareTargetPtr& shareTargetPtr)
 {
-    COMMON_RET_IF(!shareTargetPtr);
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RET_IF(dbConnector->DBInitialize(GetShareTargetDataDBFilePath(), false) == false);
-    DBCycleCloser cycle(dbConnector);
+    COMMON_RETV_IF(!shareTargetPtr, ERR_FAIL);
+    DBCycleCloser cycle(GetShareTargetDataDBFilePath(), DBCycleCloser::Mode::WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
     // A scan that could not finish (busy, broken file) must not let a
     // second row with the same id in.
     int scanResult = SQLITE_DONE;
@@ -66,19 +63,22 @@ void ShareTargetDBController::Insert(const ShareTargetPtr& shareTargetPtr)
     else if (scanResult != SQLITE_DONE)
         COMMON_LOG("Fail to read SHARE_TARGET_TABLE : %d", scanResult);
     if (isStored || scanResult != SQLITE_DONE)
-        return;
-    DBStatement statement(mQueryGenernator.MakeInsertQuery(SHARE_TARGET_TABLE, SHARE_TARGET_INSERT_COLUMNS,
-                                                           SHARE_TARGET_PLACEHOLDERS));
-    statement.BindText(1, shareTargetPtr->GetAppID());
-    statement.BindText(2, shareTargetPtr->GetPortID());
-    statement.Step();
+        return isStored ? ERR_OK : ERR_FAIL;
+    bool isDone = false;
+    {
+        DBStatement statement(QueryGenernator().MakeInsertQuery(
+            SHARE_TARGET_TABLE, SHARE_TARGET_INSERT_COLUMNS, SHARE_TARGET_PLACEHOLDERS));
+        statement.BindText(1, shareTargetPtr->GetAppID());
+        statement.BindText(2, shareTargetPtr->GetPortID());
+        isDone = statement.Execute();
+    }
+    return cycle.Close(isDone) ? ERR_OK : ERR_FAIL;
 }
 
 ShareTargetPtrVectorPtr ShareTargetDBController::Select()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetShareTargetDataDBFilePath(), true) == false, nullptr);
-    DBCycleCloser cycle(dbConnector);
+    DBCycleCloser cycle(GetShareTargetDataDBFilePath(), DBCycleCloser::Mode::READ);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, nullptr);
     return SelectRows();
 }
 
@@ -86,7 +86,7 @@ void ShareTargetDBController::UpgradeDB(double /*currentVersion*/) {}
 
 bool ShareTargetDBController::IsAppIdStored(const std::string& appId, int& stepResult)
 {
-    DBStatement statement(mQueryGenernator.MakeSelectQuery(SHARE_TARGET_TABLE, SHARE_TARGET_SELECT_COLUMNS));
+    DBStatement statement(QueryGenernator().MakeSelectQuery(SHARE_TARGET_TABLE, SHARE_TARGET_SELECT_COLUMNS));
     while ((stepResult = statement.Step()) == SQLITE_ROW)
     {
         if (statement.ColumnText(0) == appId)
@@ -98,7 +98,7 @@ bool ShareTargetDBController::IsAppIdStored(const std::string& appId, int& stepR
 ShareTargetPtrVectorPtr ShareTargetDBController::SelectRows()
 {
     auto shareTargetPtrVector = std::make_shared<ShareTargetPtrVector>();
-    DBStatement statement(mQueryGenernator.MakeSelectQuery(SHARE_TARGET_TABLE, SHARE_TARGET_SELECT_COLUMNS));
+    DBStatement statement(QueryGenernator().MakeSelectQuery(SHARE_TARGET_TABLE, SHARE_TARGET_SELECT_COLUMNS));
     int result = statement.Step();
     if (result != SQLITE_ROW)
         COMMON_LOG("No result : %d", result);

@@ -2,7 +2,6 @@
 
 #include <cstdio>
 
-#include "DBConnector.h"
 #include "QueryGenernator.h"
 
 namespace NSWeather
@@ -13,24 +12,28 @@ namespace
 constexpr size_t CREATE_QUERY_BUFFER_SIZE = 1024;
 }  // namespace
 
-void TableQuery::CreateTable(const char* createFormat, const char* tableName)
+// Only table names, never values, are put into these texts.
+bool TableQuery::CreateTable(const char* createFormat, const char* tableName)
 {
     char query[CREATE_QUERY_BUFFER_SIZE] = {};
-    snprintf(query, sizeof(query), createFormat, tableName);
-    DBConnector::GetInstance()->DBExecuteQuery(query);
+    int length = snprintf(query, sizeof(query), createFormat, tableName);
+    COMMON_RETV_IF(length < 0 || static_cast<size_t>(length) >= sizeof(query), false);
+    return DBStatement(query).Execute();
 }
 
-void TableQuery::DeleteAll(const char* tableName)
+bool TableQuery::DeleteAll(const char* tableName)
 {
-    DBConnector::GetInstance()->DBExecuteQuery((std::string("DELETE FROM ") + tableName + ";").c_str());
+    return DBStatement(std::string("DELETE FROM ") + tableName + ";").Execute();
 }
 
-void TableQuery::Delete(const char* tableName, int foreignKey)
+bool TableQuery::Delete(const char* tableName, int foreignKey)
 {
     DBStatement stmt(std::string("DELETE FROM ") + tableName + " WHERE FK_ID=?;");
     stmt.BindInt(1, foreignKey);
-    if (stmt.Step() != SQLITE_DONE)
-        COMMON_LOG("Fail to Delete");
+    if (stmt.Execute())
+        return true;
+    COMMON_LOG("Fail to Delete");
+    return false;
 }
 
 bool TableQuery::IsTableExist(const char* tableName)

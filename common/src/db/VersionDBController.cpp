@@ -1,10 +1,10 @@
 #include "VersionDBController.h"
 
 #include "CommonLog.h"
-#include "DBConnector.h"
 #include "DBCycleCloser.h"
 #include "DBStatement.h"
 #include "FileUtil.h"
+#include "QueryGenernator.h"
 #include "TableQuery.h"
 #include "WeatherDefine.h"
 
@@ -30,26 +30,22 @@ VersionDBController::~VersionDBController() = default;
 
 int VersionDBController::Initialize()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetVersionDBFilePath(), false) == false, ERR_FAIL);
-    DBCycleCloser cycle(dbConnector);
-    CreateTable();
-    if (GetCurrentVersion() < 0)
-        Insert(0.0);
-    return ERR_OK;
+    DBCycleCloser cycle(GetVersionDBFilePath(), DBCycleCloser::Mode::WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
+    bool isDone = CreateTable() && (GetCurrentVersion() >= 0 || Insert(0.0));
+    return cycle.Close(isDone) ? ERR_OK : ERR_FAIL;
 }
 
 double VersionDBController::GetCurrentDBVersion()
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetVersionDBFilePath(), true) == false, 0.0);
-    DBCycleCloser cycle(dbConnector);
+    DBCycleCloser cycle(GetVersionDBFilePath(), DBCycleCloser::Mode::READ);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, 0.0);
     return GetCurrentVersion();
 }
 
 double VersionDBController::GetCurrentVersion()
 {
-    DBStatement statement(mQueryGenernator.MakeSelectQuery(VERSION_TABLE, "dbVersion"));
+    DBStatement statement(QueryGenernator().MakeSelectQuery(VERSION_TABLE, "dbVersion"));
     int result = statement.Step();
     if (result != SQLITE_ROW)
     {
@@ -64,32 +60,30 @@ double VersionDBController::GetLatestDBVersion() const
     return LATEST_DB_VERSION;
 }
 
-void VersionDBController::Insert(double version)
+bool VersionDBController::Insert(double version)
 {
-    DBStatement statement(mQueryGenernator.MakeInsertQuery(VERSION_TABLE, "dbVersion", "?"));
+    DBStatement statement(QueryGenernator().MakeInsertQuery(VERSION_TABLE, "dbVersion", "?"));
     statement.BindDouble(1, version);
-    statement.Step();
+    return statement.Execute();
 }
 
-void VersionDBController::Update(double version)
+bool VersionDBController::Update(double version)
 {
-    DBStatement statement(mQueryGenernator.MakeUpdateQuery(VERSION_TABLE, "dbVersion = ?"));
+    DBStatement statement(QueryGenernator().MakeUpdateQuery(VERSION_TABLE, "dbVersion = ?"));
     statement.BindDouble(1, version);
-    statement.Step();
+    return statement.Execute();
 }
 
 bool VersionDBController::UpgradeDB(double version)
 {
-    DBConnector* dbConnector = DBConnector::GetInstance();
-    COMMON_RETV_IF(dbConnector->DBInitialize(GetVersionDBFilePath(), false) == false, false);
-    DBCycleCloser cycle(dbConnector);
-    Update(version);
-    return true;
+    DBCycleCloser cycle(GetVersionDBFilePath(), DBCycleCloser::Mode::WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, false);
+    return cycle.Close(Update(version));
 }
 
-void VersionDBController::CreateTable()
+bool VersionDBController::CreateTable()
 {
-    TableQuery::CreateTable(VERSION_CREATE_FORMAT, VERSION_TABLE);
+    return TableQuery::CreateTable(VERSION_CREATE_FORMAT, VERSION_TABLE);
 }
 
 }  // namespace NSWeather

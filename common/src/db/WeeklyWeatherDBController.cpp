@@ -14,13 +14,15 @@ const char* const WeeklyWeatherDBController::TABLE_NAME = "WEEKLY_WEATHER_TABLE"
 const char* const WeeklyWeatherDBController::CREATE_TABLE_FORMAT =
     "CREATE TABLE IF NOT EXISTS %s (FK_ID\t\t\t\tINTEGER,weeklyIndex\t\tINTEGER,weatherIcon\t\tINTEGER,"
     "weatherStatus\t\tTEXT,curTemperature\t\tDOUBLE,lowTemperature\t\tDOUBLE,highTemperature\tDOUBLE,"
-    "date\t\t\t\tINT64,websiteUrl \t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE ON "
+    "date\t\t\t\tINT64,websiteUrl \t\tTEXT,FOREIGN KEY(FK_ID) REFERENCES CITY_TABLE(PK_ID) ON DELETE CASCADE "
+    "ON "
     "UPDATE CASCADE);";
 
 namespace
 {
 const char* const INSERT_COLUMNS =
-    "FK_ID,weeklyIndex,weatherIcon,weatherStatus,curTemperature,lowTemperature,highTemperature,date,websiteUrl";
+    "FK_ID,weeklyIndex,weatherIcon,weatherStatus,curTemperature,lowTemperature,highTemperature,date,"
+    "websiteUrl";
 const char* const INSERT_PLACEHOLDERS = "?, ?, ?, ?, ?, ?, ?, ?, ?";
 const char* const UPDATE_ASSIGNMENTS =
     "weatherIcon = ?,weatherStatus = ?,curTemperature = ?,lowTemperature = ?,highTemperature = ?,date = ?,"
@@ -63,49 +65,47 @@ WeeklyPtr ReadWeekly(const DBStatement& stmt)
 }
 }  // namespace
 
-WeeklyWeatherDBController::WeeklyWeatherDBController()
+WeeklyWeatherDBController::WeeklyWeatherDBController() {}
+
+WeeklyWeatherDBController::~WeeklyWeatherDBController() {}
+
+bool WeeklyWeatherDBController::CreateTable()
 {
+    return TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
 }
 
-WeeklyWeatherDBController::~WeeklyWeatherDBController()
+bool WeeklyWeatherDBController::DeleteAll()
 {
+    return TableQuery::DeleteAll(TABLE_NAME);
 }
 
-void WeeklyWeatherDBController::CreateTable()
+bool WeeklyWeatherDBController::Delete(int foreignKey)
 {
-    TableQuery::CreateTable(CREATE_TABLE_FORMAT, TABLE_NAME);
+    return TableQuery::Delete(TABLE_NAME, foreignKey);
 }
 
-void WeeklyWeatherDBController::DeleteAll()
+bool WeeklyWeatherDBController::Insert(int foreignKey, WeeklyPtrVectorPtr weeklyPtrVector)
 {
-    TableQuery::DeleteAll(TABLE_NAME);
+    COMMON_RETV_IF(!weeklyPtrVector, true);
+    return TableQuery::InsertList(
+        mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS), foreignKey,
+        *weeklyPtrVector, BindValues);
 }
 
-void WeeklyWeatherDBController::Delete(int foreignKey)
+bool WeeklyWeatherDBController::Update(int foreignKey, WeeklyPtrVectorPtr weeklyPtrVector)
 {
-    TableQuery::Delete(TABLE_NAME, foreignKey);
-}
-
-void WeeklyWeatherDBController::Insert(int foreignKey, WeeklyPtrVectorPtr weeklyPtrVector)
-{
-    COMMON_RET_IF(!weeklyPtrVector);
-    TableQuery::InsertList(mQueryGenernator.MakeInsertQuery(TABLE_NAME, INSERT_COLUMNS, INSERT_PLACEHOLDERS),
-                           foreignKey, *weeklyPtrVector, BindValues);
-}
-
-void WeeklyWeatherDBController::Update(int foreignKey, WeeklyPtrVectorPtr weeklyPtrVector)
-{
-    COMMON_RET_IF(!weeklyPtrVector);
-    TableQuery::UpdateList(mQueryGenernator.MakeUpdateQuery(
-                               TABLE_NAME, UPDATE_ASSIGNMENTS,
-                               mQueryGenernator.MakeWhereClause("FK_ID = ? AND weeklyIndex = ?;")),
-                           foreignKey, *weeklyPtrVector, BindValues);
+    COMMON_RETV_IF(!weeklyPtrVector, true);
+    return TableQuery::UpdateList(
+        mQueryGenernator.MakeUpdateQuery(TABLE_NAME, UPDATE_ASSIGNMENTS,
+                                         mQueryGenernator.MakeWhereClause("FK_ID = ? AND weeklyIndex = ?;")),
+        foreignKey, *weeklyPtrVector, BindValues);
 }
 
 WeeklyPtrVectorPtr WeeklyWeatherDBController::Select(int foreignKey)
 {
     return TableQuery::SelectList(
-        mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS, mQueryGenernator.MakeWhereClause("FK_ID = ?")),
+        mQueryGenernator.MakeSelectQuery(TABLE_NAME, SELECT_COLUMNS,
+                                         mQueryGenernator.MakeWhereClause("FK_ID = ?")),
         foreignKey, ReadWeekly);
 }
 

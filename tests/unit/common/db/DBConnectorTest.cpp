@@ -57,7 +57,8 @@ TEST_F(DBConnectorTest, EmptyAndMissingPaths)
     std::string missing = DBDir() + "/missing.db";
     EXPECT_FALSE(mConnector->DBInitialize(missing, true));
     EXPECT_TRUE(mLog.Contains("sqlite3_open_open failed."));
-    EXPECT_TRUE(mLog.Contains("(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY) == false)"));
+    EXPECT_TRUE(
+        mLog.Contains("(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY) == false)"));
     EXPECT_FALSE(mConnector->GetIsOpened());
     EXPECT_FALSE(FileExists(missing));
 
@@ -118,17 +119,18 @@ TEST_F(DBConnectorTest, FailedCommitClosesTheConnector)
 {
     ASSERT_TRUE(mConnector->DBInitialize(WeatherDBPath(), false));
     EXPECT_TRUE(mConnector->DBExecuteQuery("COMMIT;"));
-    mConnector->DBFinalize();
+    EXPECT_FALSE(mConnector->DBFinalize());
     EXPECT_TRUE(mLog.Contains("(DBEndTransaction() == false) [return]"));
     EXPECT_FALSE(mConnector->GetIsOpened());
 
-    mConnector->DBFinalize();
+    EXPECT_FALSE(mConnector->DBFinalize());
     EXPECT_TRUE(mLog.Contains("mDBHandle is NULL"));
 }
 
 TEST_F(DBConnectorTest, NullTextReadsAsEmpty)
 {
-    RawDB(WeatherDBPath()).Exec("INSERT INTO CITY_TABLE (pageIndex, locationId, cityName) VALUES (0, 'id', NULL);");
+    RawDB(WeatherDBPath())
+        .Exec("INSERT INTO CITY_TABLE (pageIndex, locationId, cityName) VALUES (0, 'id', NULL);");
     CityPtrVectorPtr cities = DBController().SelectAllCityData();
     ASSERT_TRUE(cities);
     ASSERT_EQ(cities->size(), 1u);

@@ -21,8 +21,8 @@ using WeatherTest::RawDB;
 
 namespace
 {
-const char* const kReadFailure = "(dbConnector->DBInitialize(GetWeatherDBFilePath(), true) == false) [return]";
-const char* const kWriteFailure = "(dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false) [return]";
+const char* const kReadFailure = " for reading";
+const char* const kWriteFailure = " for writing";
 
 struct Operation
 {
@@ -44,13 +44,17 @@ std::vector<Operation> AllOperations()
         {"SelectNeedToUpdateLocationIDData", true,
          [](DBController& db) { return !db.SelectNeedToUpdateLocationIDData(); }},
         {"GetNumberOfCities", true, [](DBController& db) { return db.GetNumberOfCities() == -1; }},
-        {"GetPageIndexOfCurrentCity", true, [](DBController& db) { return db.GetPageIndexOfCurrentCity() == -1; }},
+        {"GetPageIndexOfCurrentCity", true,
+         [](DBController& db) { return db.GetPageIndexOfCurrentCity() == -1; }},
         {"GetPageIndexWithLocationID", true,
          [](DBController& db) { return db.GetPageIndexWithLocationID("A") == -1; }},
-        {"GetLocationIdOfCurrentCity", true, [](DBController& db) { return db.GetLocationIdOfCurrentCity().empty(); }},
+        {"GetLocationIdOfCurrentCity", true,
+         [](DBController& db) { return db.GetLocationIdOfCurrentCity().empty(); }},
         {"IsCurrentLocationExist", true, [](DBController& db) { return !db.IsCurrentLocationExist(); }},
-        {"InsertCityData", false, [](DBController& db) { return db.InsertCityData(MakeCity("A", 0)) == ERR_FAIL; }},
-        {"UpdateCityData", false, [](DBController& db) { return db.UpdateCityData(MakeCity("A", 0)) == ERR_FAIL; }},
+        {"InsertCityData", false,
+         [](DBController& db) { return db.InsertCityData(MakeCity("A", 0)) == ERR_FAIL; }},
+        {"UpdateCityData", false,
+         [](DBController& db) { return db.UpdateCityData(MakeCity("A", 0)) == ERR_FAIL; }},
         {"UpdateOnlyWidgetReferenceCount", false,
          [](DBController& db) { return db.UpdateOnlyWidgetReferenceCount("A", true) == ERR_FAIL; }},
         {"UpdateOnlyMobileLink", false,
@@ -64,7 +68,8 @@ std::vector<Operation> AllOperations()
          [two](DBController& db) { return db.DeleteAllCityDataAndInsertCityPtrVector(two) == ERR_FAIL; }},
         {"UpdateOnlyMoonPhaseData", false,
          [](DBController& db) { return db.UpdateOnlyMoonPhaseData(MakeCity("A", 0)) == ERR_FAIL; }},
-        {"DeleteUselessMoonPhaseData", false, [](DBController& db) { return db.DeleteUselessMoonPhaseData() == ERR_FAIL; }},
+        {"DeleteUselessMoonPhaseData", false,
+         [](DBController& db) { return db.DeleteUselessMoonPhaseData() == ERR_FAIL; }},
         {"GetIsWeatherInfoExpired", true, [](DBController& db) { return !db.GetIsWeatherInfoExpired(); }},
     };
 }
@@ -83,7 +88,8 @@ protected:
             EXPECT_TRUE(op.run(db)) << op.name;
             if (std::string(op.name) != "GetIsWeatherInfoExpired")
             {
-                EXPECT_TRUE(mLog.Contains(op.isReader ? kReadFailure : kWriteFailure)) << op.name << mLog.Dump();
+                EXPECT_TRUE(mLog.Contains(op.isReader ? kReadFailure : kWriteFailure))
+                    << op.name << mLog.Dump();
             }
             EXPECT_FALSE(DBConnector::GetInstance()->GetIsOpened()) << op.name;
         }
@@ -100,8 +106,7 @@ TEST_F(DBControllerBadInputTest, RandomBytesAreNeitherReadNorOverwritten)
 {
     std::mt19937 random(7);
     std::string bytes(8192, '\0');
-    for (char& c : bytes)
-        c = static_cast<char>(random());
+    for (char& c : bytes) c = static_cast<char>(random());
     ReplaceWeatherDB(bytes);
     ExpectEveryOperationFails();
     EXPECT_EQ(WeatherTest::ReadText(WeatherDBPath()), bytes);
@@ -140,7 +145,9 @@ TEST_F(DBControllerBadInputTest, ForeignSchemaGivesEmptyResults)
     ReplaceWeatherDB("");
     {
         RawDB raw(WeatherDBPath());
-        raw.Exec("CREATE TABLE CITY_TABLE (name TEXT); INSERT INTO CITY_TABLE VALUES ('theirs'), ('also theirs');");
+        raw.Exec(
+            "CREATE TABLE CITY_TABLE (name TEXT); INSERT INTO CITY_TABLE VALUES ('theirs'), ('also "
+            "theirs');");
         raw.Exec("CREATE TABLE notes (body TEXT); INSERT INTO notes VALUES ('keep');");
     }
     DBController db;
@@ -160,7 +167,8 @@ TEST_F(DBControllerBadInputTest, ForeignSchemaGivesEmptyResults)
     EXPECT_TRUE(mLog.Contains("Fail: sqlite3_prepare_v2 Failed"));
     EXPECT_FALSE(DBConnector::GetInstance()->GetIsOpened());
     RawDB raw(WeatherDBPath());
-    EXPECT_EQ(raw.QueryTexts("SELECT name FROM CITY_TABLE;"), (std::vector<std::string>{"theirs", "also theirs"}));
+    EXPECT_EQ(raw.QueryTexts("SELECT name FROM CITY_TABLE;"),
+              (std::vector<std::string>{"theirs", "also theirs"}));
     EXPECT_EQ(raw.QueryTexts("SELECT body FROM notes;"), (std::vector<std::string>{"keep"}));
 }
 

@@ -1,5 +1,6 @@
 #include <sstream>
 
+#include <sqlite3.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -120,12 +121,10 @@ TEST_F(SettingDBControllerTest, NullRecordWritesNothingAndDisplayCityWritesOneCo
 TEST_F(SettingDBControllerTest, MissingDatabaseIsNeitherReadNorCreated)
 {
     EXPECT_EQ(ERR_FAIL, SettingDBController().Initialize());
-    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetSettingDBFilePath(), false) == false"))
-        << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("/.setting.db for writing")) << mLog.Dump();
     MakeDBDir();
     EXPECT_FALSE(SettingDBController().Select());
-    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetSettingDBFilePath(), true) == false"))
-        << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("/.setting.db for reading")) << mLog.Dump();
     EXPECT_FALSE(SettingsTest::FileExists(SettingDBPath()));
 }
 
@@ -189,6 +188,67 @@ TEST_F(SettingDBControllerTest, LaterWriterOfTwoProcessesWinsEveryColumn)
     EXPECT_EQ("cmaweather", read->GetCpType());
     EXPECT_EQ(1, read->GetTemperatureUnit());
     EXPECT_EQ(1, RawDB(SettingDBPath()).QueryInt("SELECT COUNT(*) FROM SETTING_TABLE"));
+}
+
+// Another process writes one column while the read-change-write is between
+// its read and its write: that write waits for the lock and survives.
+TEST_F(SettingDBControllerTest, ReadChangeWriteDoesNotUndoAWriteOfAnotherProcess)
+{
+    InitializeSettings();
+    int go[2];
+    int blocked[2];
+    ASSERT_EQ(0, pipe(go));
+    ASSERT_EQ(0, pipe(blocked));
+    pid_t pid = fork();
+    ASSERT_GE(pid, 0);
+    if (pid == 0)
+    {
+        char byte = 0;
+        sqlite3* db = nullptr;
+        if (read(go[0], &byte, 1) != 1 || sqlite3_open(SettingDBPath().c_str(), &db) != SQLITE_OK)
+            _exit(2);
+        // Says once that the write is held back, then keeps retrying.
+        auto onBusy = [](void* fd, int count) -> int
+        {
+            char b = 'b';
+            if (count == 0 && write(*static_cast<int*>(fd), &b, 1) != 1)
+                return 0;
+            usleep(20000);
+            return count < 500;
+        };
+        sqlite3_busy_handler(db, onBusy, &blocked[1]);
+        int rc =
+            sqlite3_exec(db, "UPDATE SETTING_TABLE SET CpType = 'cmaweather';", nullptr, nullptr, nullptr);
+        sqlite3_close(db);
+        _exit(rc == SQLITE_OK ? 0 : 3);
+    }
+    SettingPtr written = SettingDBController().SelectAndUpdate(
+        [&](const SettingPtr& s)
+        {
+            s->SetTemperatureUnit(0);
+            char byte = 'g';
+            ASSERT_EQ(1, write(go[1], &byte, 1));
+            ASSERT_EQ(1, read(blocked[0], &byte, 1));
+        });
+    int status = -1;
+    ASSERT_EQ(pid, waitpid(pid, &status, 0));
+    for (int fd : {go[0], go[1], blocked[0], blocked[1]}) close(fd);
+    EXPECT_TRUE(WIFEXITED(status) && WEXITSTATUS(status) == 0) << status;
+    ASSERT_TRUE(written);
+    EXPECT_EQ(0, written->GetTemperatureUnit());
+    SettingPtr read = SettingDBController().Select();
+    ASSERT_TRUE(read);
+    EXPECT_EQ(0, read->GetTemperatureUnit());
+    EXPECT_EQ("cmaweather", read->GetCpType());
+}
+
+TEST_F(SettingDBControllerTest, ReadChangeWriteWithoutARowWritesNothing)
+{
+    MakeDBDir();
+    bool isCalled = false;
+    EXPECT_FALSE(SettingDBController().SelectAndUpdate([&](const SettingPtr&) { isCalled = true; }));
+    EXPECT_FALSE(isCalled);
+    EXPECT_FALSE(SettingDBController().SelectAndUpdate(nullptr));
 }
 
 }  // namespace

@@ -195,8 +195,7 @@ TEST_F(UpgradeFixture, UnopenableWeatherDatabaseLeavesTheVersionForTheNextStart)
     ASSERT_EQ(0, mkdir(WeatherDBPath().c_str(), 0755));
 
     DataStoreInitializer::Run();
-    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetWeatherDBFilePath(), false) == false"))
-        << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("/.weather.db for writing")) << mLog.Dump();
     EXPECT_EQ(1, mLog.Count("UpgradeDBTables < 0.4 : ")) << mLog.Dump();
     EXPECT_EQ(0, mLog.Count("UpgradeDBTables < 0.5 : ")) << mLog.Dump();
     EXPECT_DOUBLE_EQ(0.3, StoredVersion());
@@ -215,8 +214,7 @@ TEST_F(UpgradeFixture, UnreadableVersionDatabaseCountsAsVersionZero)
 {
     MakeDBDir();
     EXPECT_DOUBLE_EQ(0.0, VersionDBController().GetCurrentDBVersion());
-    EXPECT_TRUE(mLog.Contains("dbConnector->DBInitialize(GetVersionDBFilePath(), true) == false"))
-        << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("/.version.db for reading")) << mLog.Dump();
     UpgradeDBController controller;
     EXPECT_TRUE(controller.IsNeedToUpgrade());
     EXPECT_DOUBLE_EQ(0.0, controller.GetCurrentVersion());

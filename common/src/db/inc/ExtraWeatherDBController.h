@@ -20,11 +20,12 @@ public:
     ExtraWeatherDBController();
     virtual ~ExtraWeatherDBController();
 
-    void CreateTable();
-    void DeleteAll();
-    void Delete(int foreignKey);
-    void Insert(int foreignKey, ExtraPtr extraPtr);
-    void Update(int foreignKey, ExtraPtr extraPtr);
+    // Writers return false when a step failed; a null record writes nothing.
+    bool CreateTable();
+    bool DeleteAll();
+    bool Delete(int foreignKey);
+    bool Insert(int foreignKey, ExtraPtr extraPtr);
+    bool Update(int foreignKey, ExtraPtr extraPtr);
     // Null when the city has no row.
     ExtraPtr Select(int foreignKey);
     // Every city's row by FK_ID in one pass (the first row of a key wins).

@@ -25,13 +25,14 @@ public:
     CityDBController();
     virtual ~CityDBController();
 
-    void CreateTable();
+    // Writers return false when a step failed or the record is null.
+    bool CreateTable();
     // A current-location city gets ":C" appended to its id (record and row).
-    void Insert(CityPtr cityPtr);
+    bool Insert(CityPtr cityPtr);
     // Leaves the widget reference count as stored.
-    void Update(CityPtr cityPtr, int primaryKey);
-    void UpdateOnlyWidgetReferenceCount(const std::string& locationId, int count);
-    void UpdateOnlyMobileLink(CityPtr cityPtr, int primaryKey);
+    bool Update(CityPtr cityPtr, int primaryKey);
+    bool UpdateOnlyWidgetReferenceCount(const std::string& locationId, int count);
+    bool UpdateOnlyMobileLink(CityPtr cityPtr, int primaryKey);
     int GetLastInsertedPrimaryKey();
     // 0 when no row matches.
     int GetPrimaryKey(int pageIndex);
@@ -44,12 +45,13 @@ public:
     std::string GetLocationIdOfCurrentCity();
     bool IsCurrentLocationExist();
     // Page indexes become 0, 1, ... in insertion (PK_ID) order.
-    void SetPageIndexAsAscending();
-    void Delete(int primaryKey);
-    void DeleteAll();
+    bool SetPageIndexAsAscending();
+    bool Delete(int primaryKey);
+    bool DeleteAll();
     // Each city's stored page index names its row; its position in the
     // vector becomes the new page index.
-    void Reorder(CityPtrVectorPtr reorderPtrVector);
+    // False also when a city of the vector is null or names no stored row.
+    bool Reorder(CityPtrVectorPtr reorderPtrVector);
     CityPtr Select(int primaryKey);
     CityPtr Select(const std::string& locationId);
     // Every row as (PK_ID, city without children), in PK_ID order.
@@ -59,7 +61,8 @@ private:
     using Binder = std::function<void(DBStatement&)>;
 
     std::string ResolveLocationId(CityPtr cityPtr);
-    int SelectInt(const std::string& column, const std::string& condition, const Binder& binder, int defaultValue);
+    int SelectInt(const std::string& column, const std::string& condition, const Binder& binder,
+                  int defaultValue);
     std::string SelectText(const std::string& column, const std::string& condition, const Binder& binder);
     CityPtr SelectCity(const std::string& condition, const Binder& binder);
 

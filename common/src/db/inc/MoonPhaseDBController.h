@@ -23,12 +23,13 @@ public:
     MoonPhaseDBController();
     virtual ~MoonPhaseDBController();
 
-    void CreateTable();
-    void DeleteAll();
-    void Delete(int foreignKey);
-    void Delete(const std::string& locationId);
-    void Insert(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector);
-    void Update(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector);
+    // Writers return false when a step failed; a null record writes nothing.
+    bool CreateTable();
+    bool DeleteAll();
+    bool Delete(int foreignKey);
+    bool Delete(const std::string& locationId);
+    bool Insert(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector);
+    bool Update(int foreignKey, MoonPhasePtrVectorPtr moonPhasePtrVector);
     // Never null; empty when the city has no rows.
     MoonPhasePtrVectorPtr Select(int foreignKey);
     // Every city's rows by FK_ID in one pass, each list in the order Select

@@ -20,11 +20,12 @@ public:
     CurrentWeatherDBController();
     virtual ~CurrentWeatherDBController();
 
-    void CreateTable();
-    void DeleteAll();
-    void Delete(int foreignKey);
-    void Insert(int foreignKey, CurrentPtr currentPtr);
-    void Update(int foreignKey, CurrentPtr currentPtr);
+    // Writers return false when a step failed; a null record writes nothing.
+    bool CreateTable();
+    bool DeleteAll();
+    bool Delete(int foreignKey);
+    bool Insert(int foreignKey, CurrentPtr currentPtr);
+    bool Update(int foreignKey, CurrentPtr currentPtr);
     // Null when the city has no row.
     CurrentPtr Select(int foreignKey);
     // Every city's row by FK_ID in one pass (the first row of a key wins,

@@ -31,7 +31,11 @@ public:
     bool BindText(int index, const std::string& value);
     // Celsius rounded half up to one decimal; an absent value binds 999.
     bool BindTemperature(int index, const TemperaturePtr& temperature);
+    // A failing step is logged and fails the cycle (see DBConnector).
     int Step();
+    // Runs a statement that returns no rows; false (and the cycle failed)
+    // unless it ran to completion.
+    bool Execute();
     // Makes the statement ready to run again with new values.
     void Reset();
     // Columns start at 0.

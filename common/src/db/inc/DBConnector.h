@@ -10,7 +10,8 @@ namespace NSWeather
 
 // The one SQLite connection of the process. Every database operation is a
 // short cycle: DBInitialize (open + begin), statements, DBFinalize (commit
-// + close). Cycles never nest; at most one file is open at a time.
+// + close). Cycles never nest; at most one file is open at a time. A cycle
+// in which a step failed is rolled back instead of committed.
 class DBConnector
 {
 public:
@@ -19,11 +20,20 @@ public:
     virtual ~DBConnector();
 
     bool DBInitialize(const std::string& dbFilePath, bool isReadOnly);
-    void DBFinalize();
+    // A write cycle that holds the write lock from its first read on, so no
+    // other process writes between what it reads and what it writes back.
+    bool DBInitializeImmediate(const std::string& dbFilePath);
+    // Commits (or rolls back a failed cycle) and closes; true only when a
+    // cycle without failure was committed.
+    bool DBFinalize();
+    void MarkCycleFailed() { mIsCycleFailed = true; }
+    bool GetIsCycleFailed() const { return mIsCycleFailed; }
     // The caller owns the statement and finalises it (see DBStatement).
     sqlite3_stmt* DBPrepareQuery(const char* query);
     bool DBExecuteQuery(const char* query);
     bool GetIsOpened() const { return mDBHandle != nullptr; }
+    // SQLite's result code of the last failed call on the open handle.
+    int GetLastErrorCode() const { return mDBHandle ? sqlite3_errcode(mDBHandle) : SQLITE_MISUSE; }
 
     static int DBUtilBusyHandler(void* userData, int count);
 
@@ -35,11 +45,14 @@ private:
     bool DBFileOpen(const std::string& dbFilePath, int openFlags);
     bool DBSetBusyHandler();
     bool DBExcutePerformanceOptimization();
+    bool DBOpen(const std::string& dbFilePath, bool isReadOnly);
     bool DBStartTransaction();
     bool DBEndTransaction();
     void DBClose();
 
     sqlite3* mDBHandle;
+    bool mIsCycleFailed;
+    bool mIsImmediate;
 };
 
 }  // namespace NSWeather

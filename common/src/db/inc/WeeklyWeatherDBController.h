@@ -20,13 +20,14 @@ public:
     WeeklyWeatherDBController();
     virtual ~WeeklyWeatherDBController();
 
-    void CreateTable();
-    void DeleteAll();
-    void Delete(int foreignKey);
+    // Writers return false when a step failed; a null record writes nothing.
+    bool CreateTable();
+    bool DeleteAll();
+    bool Delete(int foreignKey);
     // Row i of the vector is stored with weeklyIndex i.
-    void Insert(int foreignKey, WeeklyPtrVectorPtr weeklyPtrVector);
+    bool Insert(int foreignKey, WeeklyPtrVectorPtr weeklyPtrVector);
     // Changes only rows that exist; extra records are not written.
-    void Update(int foreignKey, WeeklyPtrVectorPtr weeklyPtrVector);
+    bool Update(int foreignKey, WeeklyPtrVectorPtr weeklyPtrVector);
     // Never null; empty when the city has no rows.
     WeeklyPtrVectorPtr Select(int foreignKey);
     // Every city's rows by FK_ID in one pass, each list in the order Select

@@ -20,13 +20,14 @@ public:
     HourlyWeatherDBController();
     virtual ~HourlyWeatherDBController();
 
-    void CreateTable();
-    void DeleteAll();
-    void Delete(int foreignKey);
+    // Writers return false when a step failed; a null record writes nothing.
+    bool CreateTable();
+    bool DeleteAll();
+    bool Delete(int foreignKey);
     // Row i of the vector is stored with hourlyIndex i.
-    void Insert(int foreignKey, HourlyPtrVectorPtr hourlyPtrVector);
+    bool Insert(int foreignKey, HourlyPtrVectorPtr hourlyPtrVector);
     // Changes only rows that exist; extra records are not written.
-    void Update(int foreignKey, HourlyPtrVectorPtr hourlyPtrVector);
+    bool Update(int foreignKey, HourlyPtrVectorPtr hourlyPtrVector);
     // Never null; empty when the city has no rows.
     HourlyPtrVectorPtr Select(int foreignKey);
     // Every city's rows by FK_ID in one pass, each list in the order Select

@@ -16,7 +16,8 @@ public:
     virtual ~QueryGenernator();
 
     std::string MakeSelectQuery(const std::string& table, const std::string& columns,
-                                const std::string& clause1 = std::string(), const std::string& clause2 = std::string(),
+                                const std::string& clause1 = std::string(),
+                                const std::string& clause2 = std::string(),
                                 const std::string& clause3 = std::string(),
                                 const std::string& clause4 = std::string()) const;
     std::string MakeWhereClause(const std::string& condition) const;
@@ -33,7 +34,8 @@ public:
     std::string MakeLimitClause(const std::string& count) const;
     std::string MakeJoinSelectQuery(const std::string& columns, const std::string& leftSelect,
                                     const std::string& rightSelect, const std::string& leftKey,
-                                    const std::string& rightKey, const std::string& clause = std::string()) const;
+                                    const std::string& rightKey,
+                                    const std::string& clause = std::string()) const;
     std::string MakeFunctionText(const std::string& functionName, const std::string& argument) const;
 
     // conjunction 1 joins with "and", anything else with "or".

@@ -16,14 +16,15 @@ namespace NSWeather
 // The record tables keep one row per city (keyed by FK_ID); the list tables
 // keep one row per entry, with the entry's position as its index column.
 // Binders take (statement, first position, record) and return the next
-// free position; readers build a record from the current row.
+// free position; readers build a record from the current row. Writers
+// return false when a step failed (the cycle is then rolled back).
 class TableQuery
 {
 public:
     // The format has one %s for the table name.
-    static void CreateTable(const char* createFormat, const char* tableName);
-    static void DeleteAll(const char* tableName);
-    static void Delete(const char* tableName, int foreignKey);
+    static bool CreateTable(const char* createFormat, const char* tableName);
+    static bool DeleteAll(const char* tableName);
+    static bool Delete(const char* tableName, int foreignKey);
     // True when the table has a row; false when it is empty or unreadable.
     static bool IsTableExist(const char* tableName);
 
@@ -36,24 +37,24 @@ public:
 
     // Insert: FK_ID first, then the values.
     template <typename Record>
-    static void InsertRecord(const std::string& query, int foreignKey, const std::shared_ptr<Record>& record,
+    static bool InsertRecord(const std::string& query, int foreignKey, const std::shared_ptr<Record>& record,
                              Binder<Record> bind)
     {
         DBStatement stmt(query);
         stmt.BindInt(1, foreignKey);
         bind(stmt, 2, record);
-        stmt.Step();
+        return stmt.Execute();
     }
 
     // Update: the values, then FK_ID for the WHERE clause.
     template <typename Record>
-    static void UpdateRecord(const std::string& query, int foreignKey, const std::shared_ptr<Record>& record,
+    static bool UpdateRecord(const std::string& query, int foreignKey, const std::shared_ptr<Record>& record,
                              Binder<Record> bind)
     {
         DBStatement stmt(query);
         int i = bind(stmt, 1, record);
         stmt.BindInt(i, foreignKey);
-        stmt.Step();
+        return stmt.Execute();
     }
 
     // Null when the city has no row.
@@ -84,30 +85,30 @@ public:
 
     // Insert: FK_ID, the index, then the values. Entry i gets index i.
     template <typename Record>
-    static void InsertList(const std::string& query, int foreignKey,
+    static bool InsertList(const std::string& query, int foreignKey,
                            const std::vector<std::shared_ptr<Record>>& list, Binder<Record> bind)
     {
-        StepEachEntry(query, list,
-                      [&](DBStatement& stmt, int index, const std::shared_ptr<Record>& entry)
-                      {
-                          stmt.BindInt(1, foreignKey);
-                          stmt.BindInt(2, index);
-                          bind(stmt, 3, entry);
-                      });
+        return StepEachEntry(query, list,
+                             [&](DBStatement& stmt, int index, const std::shared_ptr<Record>& entry)
+                             {
+                                 stmt.BindInt(1, foreignKey);
+                                 stmt.BindInt(2, index);
+                                 bind(stmt, 3, entry);
+                             });
     }
 
     // Update: the values, then FK_ID and the index for the WHERE clause.
     template <typename Record>
-    static void UpdateList(const std::string& query, int foreignKey,
+    static bool UpdateList(const std::string& query, int foreignKey,
                            const std::vector<std::shared_ptr<Record>>& list, Binder<Record> bind)
     {
-        StepEachEntry(query, list,
-                      [&](DBStatement& stmt, int index, const std::shared_ptr<Record>& entry)
-                      {
-                          int next = bind(stmt, 1, entry);
-                          stmt.BindInt(next, foreignKey);
-                          stmt.BindInt(next + 1, index);
-                      });
+        return StepEachEntry(query, list,
+                             [&](DBStatement& stmt, int index, const std::shared_ptr<Record>& entry)
+                             {
+                                 int next = bind(stmt, 1, entry);
+                                 stmt.BindInt(next, foreignKey);
+                                 stmt.BindInt(next + 1, index);
+                             });
     }
 
     // Never null; empty when the city has no rows.
@@ -142,9 +143,9 @@ private:
     TableQuery() = delete;
 
     // One prepared statement serves every entry; null entries are skipped
-    // and keep their index free.
+    // and keep their index free. Stops at the first failed entry.
     template <typename Record, typename BindEntry>
-    static void StepEachEntry(const std::string& query, const std::vector<std::shared_ptr<Record>>& list,
+    static bool StepEachEntry(const std::string& query, const std::vector<std::shared_ptr<Record>>& list,
                               BindEntry bindEntry)
     {
         DBStatement stmt(query);
@@ -154,8 +155,10 @@ private:
                 continue;
             stmt.Reset();
             bindEntry(stmt, static_cast<int>(i), list[i]);
-            stmt.Step();
+            if (stmt.Execute() == false)
+                return false;
         }
+        return true;
     }
 };
 
