@@ -4,6 +4,8 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <unicode/normalizer2.h>
+#include <unicode/uchar.h>
 #include <unicode/unistr.h>
 
 #include <algorithm>
@@ -62,8 +64,22 @@ std::string CityCatalogue::GetDefaultPath()
 
 std::string CityCatalogue::FoldCase(const std::string& text)
 {
+    // Case folded and without accents, so "montre" finds "Montréal".
+    UErrorCode status = U_ZERO_ERROR;
+    const icu::Normalizer2* nfd = icu::Normalizer2::getNFDInstance(status);
+    icu::UnicodeString decomposed = icu::UnicodeString::fromUTF8(text).foldCase();
+    if (nfd && U_SUCCESS(status))
+        decomposed = nfd->normalize(decomposed, status);
+    icu::UnicodeString plain;
+    for (int32_t i = 0; i < decomposed.length();)
+    {
+        UChar32 c = decomposed.char32At(i);
+        if (U_FAILURE(status) || u_charType(c) != U_NON_SPACING_MARK)
+            plain.append(c);
+        i += U16_LENGTH(c);
+    }
     std::string folded;
-    icu::UnicodeString::fromUTF8(text).foldCase().toUTF8String(folded);
+    plain.toUTF8String(folded);
     return folded;
 }
 

@@ -26,7 +26,8 @@ public:
     size_t GetSize() const { return mCityPtrVector.size(); }
     CatalogueCityPtr FindById(const std::string& id) const;
     // Cities whose name (either form) starts with `prefix`, compared without
-    // case (Unicode case folding), largest first, at most `maxCount`.
+    // case or accents (Unicode case folding, marks dropped), largest first,
+    // at most `maxCount`.
     CatalogueCityPtrVector FindByPrefix(const std::string& prefix, size_t maxCount) const;
     // The city nearest to the position on the globe; null for a position
     // off the globe.

@@ -13,7 +13,7 @@ const cities = JSON.parse(fs.readFileSync(path.join(packageDir, 'data', 'cityMap
 
 // Tabs and line ends would break the line format; nothing else is touched.
 const clean = (text) => String(text || '').replace(/[\t\r\n]+/g, ' ').trim();
-const slug = (text) => clean(text).toLowerCase().replace(/[^a-z0-9]+/g, '-').replace(/^-|-$/g, '');
+const slug = (text) => clean(text).normalize('NFD').replace(/[\u0300-\u036f]/g, '').toLowerCase().replace(/[^a-z0-9]+/g, '-').replace(/^-|-$/g, '');
 
 const usable = cities.filter((c) => c.timezone && c.city && c.city_ascii && c.iso2 &&
   Number.isFinite(c.lat) && Number.isFinite(c.lng) && Math.abs(c.lat) <= 90 && Math.abs(c.lng) <= 180);
