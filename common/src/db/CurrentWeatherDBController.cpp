@@ -31,9 +31,9 @@ int BindValues(DBStatement& stmt, int i, const CurrentPtr& currentPtr)
 {
     stmt.BindInt(i++, currentPtr->GetWeatherIcon());
     stmt.BindText(i++, currentPtr->GetWeatherStatus());
-    stmt.BindTemperature(i++, currentPtr->GetCurTemperature());
-    stmt.BindTemperature(i++, currentPtr->GetLowTemperature());
-    stmt.BindTemperature(i++, currentPtr->GetHighTemperature());
+    TableQuery::BindTemperature(stmt, i++, currentPtr->GetCurTemperature());
+    TableQuery::BindTemperature(stmt, i++, currentPtr->GetLowTemperature());
+    TableQuery::BindTemperature(stmt, i++, currentPtr->GetHighTemperature());
     stmt.BindInt64(i++, static_cast<int64_t>(currentPtr->GetDate()));
     stmt.BindText(i++, currentPtr->GetWebsiteUrl());
     return i;
@@ -44,9 +44,9 @@ CurrentPtr ReadCurrent(const DBStatement& stmt)
     CurrentPtr currentPtr = std::make_shared<Current>();
     currentPtr->SetWeatherIcon(stmt.ColumnInt(0));
     currentPtr->SetWeatherStatus(stmt.ColumnText(1));
-    currentPtr->SetCurTemperature(stmt.ColumnTemperature(2));
-    currentPtr->SetLowTemperature(stmt.ColumnTemperature(3));
-    currentPtr->SetHighTemperature(stmt.ColumnTemperature(4));
+    currentPtr->SetCurTemperature(TableQuery::ColumnTemperature(stmt, 2));
+    currentPtr->SetLowTemperature(TableQuery::ColumnTemperature(stmt, 3));
+    currentPtr->SetHighTemperature(TableQuery::ColumnTemperature(stmt, 4));
     currentPtr->SetDate(static_cast<time_t>(stmt.ColumnInt64(5)));
     currentPtr->SetWebsiteUrl(stmt.ColumnText(6));
     return currentPtr;

@@ -12,6 +12,7 @@ namespace
 {
 constexpr int MAX_BUSY_RETRY = 10;
 constexpr useconds_t BUSY_WAIT_STEP_USEC = 100000;
+int busyRetryLimit = MAX_BUSY_RETRY;
 }  // namespace
 
 DBConnector* DBConnector::GetInstance()
@@ -117,7 +118,7 @@ bool DBConnector::DBExecuteQuery(const char* query)
 
 int DBConnector::DBUtilBusyHandler(void* /*userData*/, int count)
 {
-    if (count >= MAX_BUSY_RETRY)
+    if (count >= busyRetryLimit)
     {
         COMMON_LOG("Busy Handler will be returned SQLITE_BUSY error");
         return 0;
@@ -125,6 +126,11 @@ int DBConnector::DBUtilBusyHandler(void* /*userData*/, int count)
     COMMON_LOG("Busy Handler Called! : CNT(%d)\n", count + 1);
     usleep(static_cast<useconds_t>(count + 1) * BUSY_WAIT_STEP_USEC);
     return 1;
+}
+
+void DBConnector::SetBusyRetryLimit(int limit)
+{
+    busyRetryLimit = limit < 0 ? MAX_BUSY_RETRY : limit;
 }
 
 bool DBConnector::DBFileOpen(const std::string& dbFilePath, int openFlags)

@@ -1,7 +1,5 @@
 #include "DBStatement.h"
 
-#include <cmath>
-
 #include "CommonLog.h"
 #include "DBConnector.h"
 
@@ -38,12 +36,6 @@ bool DBStatement::BindText(int index, const std::string& value)
 {
     return mStmt && sqlite3_bind_text(mStmt, index, value.c_str(), static_cast<int>(value.size()),
                                       SQLITE_TRANSIENT) == SQLITE_OK;
-}
-
-bool DBStatement::BindTemperature(int index, const TemperaturePtr& temperature)
-{
-    double celsius = temperature ? temperature->GetCelsius() : 999.0;
-    return BindDouble(index, std::floor(0.5 + celsius * 10) / 10);
 }
 
 int DBStatement::Step()
@@ -104,13 +96,6 @@ std::string DBStatement::ColumnText(int column) const
         return std::string();
     int bytes = sqlite3_column_bytes(mStmt, column);
     return std::string(reinterpret_cast<const char*>(text), static_cast<size_t>(bytes));
-}
-
-TemperaturePtr DBStatement::ColumnTemperature(int column) const
-{
-    TemperaturePtr temperature = std::make_shared<Temperature>();
-    temperature->SetCelsiusValue(ColumnDouble(column));
-    return temperature;
 }
 
 }  // namespace NSWeather

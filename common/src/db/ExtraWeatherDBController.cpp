@@ -68,7 +68,7 @@ int BindValues(DBStatement& stmt, int i, const ExtraPtr& extraPtr)
                            extraPtr->GetAirDust(),
                            extraPtr->GetDrySkin()};
     for (int value : indexes) stmt.BindInt(i++, value);
-    stmt.BindTemperature(i++, extraPtr->GetRealfeel());
+    TableQuery::BindTemperature(stmt, i++, extraPtr->GetRealfeel());
     PrecipitationPtr precipitationPtr = extraPtr->GetPrecipitationPtr();
     if (!precipitationPtr)
         precipitationPtr = std::make_shared<Precipitation>();
@@ -106,7 +106,7 @@ ExtraPtr ReadExtra(const DBStatement& stmt)
     extraPtr->SetPollen(stmt.ColumnInt(c++));
     extraPtr->SetAirDust(stmt.ColumnInt(c++));
     extraPtr->SetDrySkin(stmt.ColumnInt(c++));
-    extraPtr->SetRealfeel(stmt.ColumnTemperature(c++));
+    extraPtr->SetRealfeel(TableQuery::ColumnTemperature(stmt, c++));
     PrecipitationPtr precipitationPtr = std::make_shared<Precipitation>();
     precipitationPtr->SetPrecType(stmt.ColumnInt(c++));
     precipitationPtr->SetPrecProbability(stmt.ColumnDouble(c++));

@@ -34,9 +34,9 @@ int BindValues(DBStatement& stmt, int i, const HourlyPtr& hourlyPtr)
     stmt.BindInt64(i++, static_cast<int64_t>(hourlyPtr->GetHour()));
     stmt.BindInt(i++, hourlyPtr->GetWeatherIcon());
     stmt.BindText(i++, hourlyPtr->GetWeatherStatus());
-    stmt.BindTemperature(i++, hourlyPtr->GetCurTemperature());
-    stmt.BindTemperature(i++, hourlyPtr->GetLowTemperature());
-    stmt.BindTemperature(i++, hourlyPtr->GetHighTemperature());
+    TableQuery::BindTemperature(stmt, i++, hourlyPtr->GetCurTemperature());
+    TableQuery::BindTemperature(stmt, i++, hourlyPtr->GetLowTemperature());
+    TableQuery::BindTemperature(stmt, i++, hourlyPtr->GetHighTemperature());
     stmt.BindText(i++, hourlyPtr->GetWebsiteUrl());
     return i;
 }
@@ -47,9 +47,9 @@ HourlyPtr ReadHourly(const DBStatement& stmt)
     hourlyPtr->SetHour(static_cast<time_t>(stmt.ColumnInt64(0)));
     hourlyPtr->SetWeatherIcon(stmt.ColumnInt(1));
     hourlyPtr->SetWeatherStatus(stmt.ColumnText(2));
-    hourlyPtr->SetCurTemperature(stmt.ColumnTemperature(3));
-    hourlyPtr->SetLowTemperature(stmt.ColumnTemperature(4));
-    hourlyPtr->SetHighTemperature(stmt.ColumnTemperature(5));
+    hourlyPtr->SetCurTemperature(TableQuery::ColumnTemperature(stmt, 3));
+    hourlyPtr->SetLowTemperature(TableQuery::ColumnTemperature(stmt, 4));
+    hourlyPtr->SetHighTemperature(TableQuery::ColumnTemperature(stmt, 5));
     hourlyPtr->SetWebsiteUrl(stmt.ColumnText(6));
     return hourlyPtr;
 }

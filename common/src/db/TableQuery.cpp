@@ -1,5 +1,6 @@
 #include "TableQuery.h"
 
+#include <cmath>
 #include <cstdio>
 
 #include "QueryGenernator.h"
@@ -46,6 +47,19 @@ bool TableQuery::IsTableExist(const char* tableName)
         return false;
     }
     return statement.ColumnDouble(0) > 0;
+}
+
+bool TableQuery::BindTemperature(DBStatement& stmt, int index, const TemperaturePtr& temperature)
+{
+    double celsius = temperature ? temperature->GetCelsius() : 999.0;
+    return stmt.BindDouble(index, std::floor(0.5 + celsius * 10) / 10);
+}
+
+TemperaturePtr TableQuery::ColumnTemperature(const DBStatement& stmt, int column)
+{
+    TemperaturePtr temperature = std::make_shared<Temperature>();
+    temperature->SetCelsiusValue(stmt.ColumnDouble(column));
+    return temperature;
 }
 
 }  // namespace NSWeather

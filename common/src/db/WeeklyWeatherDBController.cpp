@@ -34,9 +34,9 @@ int BindValues(DBStatement& stmt, int i, const WeeklyPtr& weeklyPtr)
 {
     stmt.BindInt(i++, weeklyPtr->GetWeatherIcon());
     stmt.BindText(i++, weeklyPtr->GetWeatherStatus());
-    stmt.BindTemperature(i++, weeklyPtr->GetCurTemperature());
-    stmt.BindTemperature(i++, weeklyPtr->GetLowTemperature());
-    stmt.BindTemperature(i++, weeklyPtr->GetHighTemperature());
+    TableQuery::BindTemperature(stmt, i++, weeklyPtr->GetCurTemperature());
+    TableQuery::BindTemperature(stmt, i++, weeklyPtr->GetLowTemperature());
+    TableQuery::BindTemperature(stmt, i++, weeklyPtr->GetHighTemperature());
     stmt.BindInt64(i++, static_cast<int64_t>(weeklyPtr->GetDate()));
     stmt.BindText(i++, weeklyPtr->GetWebsiteUrl());
     return i;
@@ -55,9 +55,9 @@ WeeklyPtr ReadWeekly(const DBStatement& stmt)
     WeeklyPtr weeklyPtr = std::make_shared<Weekly>();
     weeklyPtr->SetWeatherIcon(stmt.ColumnInt(0));
     weeklyPtr->SetWeatherStatus(stmt.ColumnText(1));
-    weeklyPtr->SetCurTemperature(stmt.ColumnTemperature(2));
-    weeklyPtr->SetLowTemperature(stmt.ColumnTemperature(3));
-    weeklyPtr->SetHighTemperature(stmt.ColumnTemperature(4));
+    weeklyPtr->SetCurTemperature(TableQuery::ColumnTemperature(stmt, 2));
+    weeklyPtr->SetLowTemperature(TableQuery::ColumnTemperature(stmt, 3));
+    weeklyPtr->SetHighTemperature(TableQuery::ColumnTemperature(stmt, 4));
     weeklyPtr->SetDate(static_cast<time_t>(stmt.ColumnInt64(5)));
     weeklyPtr->SetWebsiteUrl(stmt.ColumnText(6));
     weeklyPtr->SetDayOfWeek(DayOfWeek(weeklyPtr->GetDate()));

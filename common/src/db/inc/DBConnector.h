@@ -36,6 +36,9 @@ public:
     int GetLastErrorCode() const { return mDBHandle ? sqlite3_errcode(mDBHandle) : SQLITE_MISUSE; }
 
     static int DBUtilBusyHandler(void* userData, int count);
+    // Lets tests give up on a held lock after fewer waits; a negative
+    // limit restores the usual ten.
+    static void SetBusyRetryLimit(int limit);
 
 private:
     DBConnector();

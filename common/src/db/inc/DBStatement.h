@@ -6,8 +6,6 @@
 
 #include <sqlite3.h>
 
-#include "Temperature.h"
-
 namespace NSWeather
 {
 
@@ -29,8 +27,6 @@ public:
     bool BindDouble(int index, double value);
     // The text is copied, so a temporary string is safe to pass.
     bool BindText(int index, const std::string& value);
-    // Celsius rounded half up to one decimal; an absent value binds 999.
-    bool BindTemperature(int index, const TemperaturePtr& temperature);
     // A failing step is logged and fails the cycle (see DBConnector).
     int Step();
     // Runs a statement that returns no rows; false (and the cycle failed)
@@ -44,7 +40,6 @@ public:
     double ColumnDouble(int column) const;
     // SQL NULL reads as an empty string.
     std::string ColumnText(int column) const;
-    TemperaturePtr ColumnTemperature(int column) const;
 
 private:
     sqlite3_stmt* mStmt;

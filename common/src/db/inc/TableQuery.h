@@ -8,6 +8,7 @@
 
 #include "CommonLog.h"
 #include "DBStatement.h"
+#include "Temperature.h"
 
 namespace NSWeather
 {
@@ -27,6 +28,9 @@ public:
     static bool Delete(const char* tableName, int foreignKey);
     // True when the table has a row; false when it is empty or unreadable.
     static bool IsTableExist(const char* tableName);
+    // Celsius rounded half up to one decimal; an absent value binds 999.
+    static bool BindTemperature(DBStatement& stmt, int index, const TemperaturePtr& temperature);
+    static TemperaturePtr ColumnTemperature(const DBStatement& stmt, int column);
 
     template <typename Record>
     using Binder = int (*)(DBStatement&, int, const std::shared_ptr<Record>&);

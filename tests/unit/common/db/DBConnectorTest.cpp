@@ -3,8 +3,6 @@
 #include <gtest/gtest.h>
 
 #include <fstream>
-#include <poll.h>
-#include <sys/wait.h>
 #include <unistd.h>
 
 #include "DBController.h"
@@ -140,69 +138,10 @@ TEST_F(DBConnectorTest, NullTextReadsAsEmpty)
 }
 
 // The busy handler's back-off against a lock held by another process.
-namespace
-{
-class LockHolder
-{
-public:
-    // Forks a process that holds an exclusive lock on `path` until
-    // `holdMs` passes or Release is called.
-    LockHolder(const std::string& path, int holdMs)
-    {
-        int ready[2];
-        if (pipe(ready) != 0 || pipe(mRelease) != 0)
-            return;
-        mPid = fork();
-        if (mPid == 0)
-            RunChild(path, holdMs, ready[1]);
-        close(ready[1]);
-        close(mRelease[0]);
-        char byte = 0;
-        mLocked = read(ready[0], &byte, 1) == 1 && byte == 'L';
-        close(ready[0]);
-    }
-    ~LockHolder()
-    {
-        Release();
-        int status = 0;
-        if (mPid > 0)
-            waitpid(mPid, &status, 0);
-    }
-    bool GetIsLocked() const { return mLocked; }
-    void Release()
-    {
-        if (mRelease[1] >= 0)
-            close(mRelease[1]);
-        mRelease[1] = -1;
-    }
-
-private:
-    [[noreturn]] void RunChild(const std::string& path, int holdMs, int readyFd)
-    {
-        close(mRelease[1]);
-        sqlite3* db = nullptr;
-        char ok = 'F';
-        if (sqlite3_open_v2(path.c_str(), &db, SQLITE_OPEN_READWRITE, nullptr) == SQLITE_OK &&
-            sqlite3_exec(db, "BEGIN EXCLUSIVE;", nullptr, nullptr, nullptr) == SQLITE_OK)
-            ok = 'L';
-        (void)!write(readyFd, &ok, 1);
-        struct pollfd pfd = {mRelease[0], POLLIN, 0};
-        poll(&pfd, 1, holdMs);
-        sqlite3_exec(db, "COMMIT;", nullptr, nullptr, nullptr);
-        sqlite3_close(db);
-        _exit(0);
-    }
-
-    pid_t mPid = -1;
-    int mRelease[2] = {-1, -1};
-    bool mLocked = false;
-};
-}  // namespace
-
 TEST_F(DBConnectorTest, WaitsForALockReleasedWithinTheBudget)
 {
     RawDB(WeatherDBPath()).Exec("INSERT INTO CITY_TABLE (pageIndex, locationId) VALUES (0, 'a');");
-    LockHolder holder(WeatherDBPath(), 700);
+    WeatherTest::LockHolder holder({WeatherDBPath()}, "BEGIN EXCLUSIVE;", 700);
     ASSERT_TRUE(holder.GetIsLocked());
     EXPECT_EQ(DBController().GetNumberOfCities(), 1) << mLog.Dump();
     EXPECT_TRUE(mLog.Contains("Busy Handler Called! : CNT(1)"));
@@ -213,7 +152,7 @@ TEST_F(DBConnectorTest, WaitsForALockReleasedWithinTheBudget)
 
 TEST_F(DBConnectorTest, GivesUpAfterTheTenthWait)
 {
-    LockHolder holder(WeatherDBPath(), 20000);
+    WeatherTest::LockHolder holder({WeatherDBPath()}, "BEGIN EXCLUSIVE;", 20000);
     ASSERT_TRUE(holder.GetIsLocked());
     EXPECT_EQ(DBController().GetNumberOfCities(), -1);
     holder.Release();

@@ -109,12 +109,24 @@ TEST_F(DBControllerTest, CityWithAllChildrenRoundTrips)
     EXPECT_EQ(extra->GetHumidity(), 61);
     EXPECT_EQ(extra->GetSunsetTime(), 1700050000);
     EXPECT_EQ(extra->GetSunriseTime(), 1700010000);
-    const int indexes[] = {extra->GetPm25(),       extra->GetPm10(),        extra->GetAqi(),
-                           extra->GetUvIndex(),    extra->GetOutdoorExcercise(), extra->GetComfort(),
-                           extra->GetClothing(),   extra->GetSkincare(),    extra->GetCarwash(),
-                           extra->GetFoodPoison(), extra->GetHeat(),        extra->GetSpoiledFood(),
-                           extra->GetDiscomfort(), extra->GetFrozenPipes(), extra->GetFrostbite(),
-                           extra->GetCold(),       extra->GetPollen(),      extra->GetAirDust(),
+    const int indexes[] = {extra->GetPm25(),
+                           extra->GetPm10(),
+                           extra->GetAqi(),
+                           extra->GetUvIndex(),
+                           extra->GetOutdoorExcercise(),
+                           extra->GetComfort(),
+                           extra->GetClothing(),
+                           extra->GetSkincare(),
+                           extra->GetCarwash(),
+                           extra->GetFoodPoison(),
+                           extra->GetHeat(),
+                           extra->GetSpoiledFood(),
+                           extra->GetDiscomfort(),
+                           extra->GetFrozenPipes(),
+                           extra->GetFrostbite(),
+                           extra->GetCold(),
+                           extra->GetPollen(),
+                           extra->GetAirDust(),
                            extra->GetDrySkin()};
     const int expected[] = {11, 12, 13, 4, 1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12, 13, 14, 15};
     for (size_t i = 0; i < sizeof(expected) / sizeof(expected[0]); ++i)
@@ -142,16 +154,20 @@ TEST_F(DBControllerTest, ChildRowsCarryTheCityKeyAndTheirIndex)
     InsertCities({"A", "B"});
     RawDB raw(WeatherDBPath());
     int64_t keyB = raw.QueryInt("SELECT PK_ID FROM CITY_TABLE WHERE locationId = 'B';");
-    EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) + ";"), 24);
+    EXPECT_EQ(
+        raw.QueryInt("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) + ";"),
+        24);
     std::vector<std::string> indexes =
         raw.QueryTexts("SELECT hourlyIndex FROM HOURLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) +
-                   " ORDER BY hourlyIndex;");
+                       " ORDER BY hourlyIndex;");
     ASSERT_EQ(indexes.size(), 24u);
     EXPECT_EQ(indexes.front(), "0");
     EXPECT_EQ(indexes.back(), "23");
     EXPECT_EQ(raw.QueryTexts("SELECT curTemperature FROM CURRENT_WEATHER_TABLE;"),
               (std::vector<std::string>{"21.5", "21.5"}));
-    EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM WEEKLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) + ";"), 10);
+    EXPECT_EQ(
+        raw.QueryInt("SELECT COUNT(*) FROM WEEKLY_WEATHER_TABLE WHERE FK_ID = " + std::to_string(keyB) + ";"),
+        10);
 }
 
 TEST_F(DBControllerTest, EmptyTableGivesAnEmptyList)
@@ -211,7 +227,8 @@ TEST_F(DBControllerTest, CityThatIsNotStoredLeavesNoOrphanRows)
     RawDB raw(WeatherDBPath());
     for (const char* table : {"CURRENT_WEATHER_TABLE", "WEEKLY_WEATHER_TABLE", "HOURLY_WEATHER_TABLE",
                               "EXTRA_WEATHER_TABLE", "MOON_PHASE_TABLE"})
-        EXPECT_EQ(raw.QueryInt(std::string("SELECT COUNT(*) FROM ") + table + " WHERE FK_ID < 1;"), 0) << table;
+        EXPECT_EQ(raw.QueryInt(std::string("SELECT COUNT(*) FROM ") + table + " WHERE FK_ID < 1;"), 0)
+            << table;
     EXPECT_EQ(mDB.SelectCityData(0)->GetCityName(), "city A-0");
 }
 
@@ -232,7 +249,8 @@ TEST_F(DBControllerTest, DeleteRenumbersInInsertionOrder)
 {
     InsertCities({"A", "B", "C"});
     CityPtrVectorPtr cities = mDB.SelectAllCityData();
-    CityPtrVectorPtr reordered = std::make_shared<CityPtrVector>(CityPtrVector{cities->at(2), cities->at(0), cities->at(1)});
+    CityPtrVectorPtr reordered =
+        std::make_shared<CityPtrVector>(CityPtrVector{cities->at(2), cities->at(0), cities->at(1)});
     ASSERT_EQ(mDB.ReorderCityData(reordered), ERR_OK);
     EXPECT_EQ(PageOrder(), (std::vector<std::string>{"C@0", "A@1", "B@2"}));
 
@@ -304,7 +322,8 @@ TEST_F(DBControllerTest, ReferenceCountNeverDropsBelowZero)
     ASSERT_EQ(mDB.InsertCityData(city), ERR_OK);
     EXPECT_EQ(mDB.UpdateOnlyWidgetReferenceCount("A", true), ERR_OK);
     EXPECT_EQ(mDB.SelectCityData(0)->GetWidgetReferenceCount(), 1);
-    EXPECT_TRUE(mLog.Contains("query : UPDATE CITY_TABLE SET widgetReferenceCount = ? WHERE locationId = ?; [1]"));
+    EXPECT_TRUE(
+        mLog.Contains("query : UPDATE CITY_TABLE SET widgetReferenceCount = ? WHERE locationId = ?; [1]"));
     mDB.UpdateOnlyWidgetReferenceCount("A", false);
     mDB.UpdateOnlyWidgetReferenceCount("A", false);
     EXPECT_EQ(mDB.SelectCityData(0)->GetWidgetReferenceCount(), 0);
@@ -336,8 +355,8 @@ TEST_F(DBControllerTest, DeleteAllAndReplace)
     ASSERT_EQ(mDB.DeleteAllCityData(), ERR_OK);
     EXPECT_TRUE(mLog.Contains("DeleteAllCityData"));
     RawDB raw(WeatherDBPath());
-    for (const char* table : {"CITY_TABLE", "CURRENT_WEATHER_TABLE", "WEEKLY_WEATHER_TABLE", "HOURLY_WEATHER_TABLE",
-                              "EXTRA_WEATHER_TABLE"})
+    for (const char* table : {"CITY_TABLE", "CURRENT_WEATHER_TABLE", "WEEKLY_WEATHER_TABLE",
+                              "HOURLY_WEATHER_TABLE", "EXTRA_WEATHER_TABLE"})
         EXPECT_EQ(raw.QueryInt(std::string("SELECT COUNT(*) FROM ") + table + ";"), 0) << table;
 }
 
@@ -358,7 +377,8 @@ TEST_F(DBControllerTest, UselessMoonPhasesAreRemoved)
     mDB.DeleteCityData(std::string("A"));
     EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM MOON_PHASE_TABLE;"), 6);
     ASSERT_EQ(mDB.DeleteUselessMoonPhaseData(), ERR_OK);
-    EXPECT_EQ(raw.QueryTexts("SELECT DISTINCT locationID FROM MOON_PHASE_TABLE;"), (std::vector<std::string>{"B"}));
+    EXPECT_EQ(raw.QueryTexts("SELECT DISTINCT locationID FROM MOON_PHASE_TABLE;"),
+              (std::vector<std::string>{"B"}));
     EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM MOON_PHASE_TABLE;"), 3);
 }
 
@@ -412,7 +432,8 @@ TEST_F(DBControllerTest, ListAgreesWithSingleSelects)
         CityPtr listed = all->at(page);
         EXPECT_EQ(listed->GetLocationId(), one->GetLocationId());
         EXPECT_EQ(listed->GetPageIndex(), page);
-        EXPECT_EQ(static_cast<bool>(listed->GetCurrentPtr()), static_cast<bool>(one->GetCurrentPtr())) << page;
+        EXPECT_EQ(static_cast<bool>(listed->GetCurrentPtr()), static_cast<bool>(one->GetCurrentPtr()))
+            << page;
         EXPECT_EQ(listed->GetHourlyPtrVector()->size(), one->GetHourlyPtrVector()->size());
         EXPECT_EQ(listed->GetWeeklyPtrVector()->size(), one->GetWeeklyPtrVector()->size());
         EXPECT_EQ(listed->GetMoonPhasePtrVector()->size(), one->GetMoonPhasePtrVector()->size());
@@ -428,5 +449,11 @@ TEST_F(DBControllerTest, ListSkipsMissingPagesAndTakesTheFirstOfADuplicate)
 {
     InsertCities({"A", "B", "C"});
     RawDB(WeatherDBPath()).Exec("UPDATE CITY_TABLE SET pageIndex = 0 WHERE locationId = 'B';");
+    EXPECT_EQ(PageOrder(), (std::vector<std::string>{"A@0", "C@2"}));
+
+    // A gap: C keeps page 2 at position 1; D (page 3) lies beyond the row
+    // count until a writer renumbers the pages.
+    InsertCities({"D"});
+    RawDB(WeatherDBPath()).Exec("DELETE FROM CITY_TABLE WHERE locationId = 'B';");
     EXPECT_EQ(PageOrder(), (std::vector<std::string>{"A@0", "C@2"}));
 }

@@ -1,5 +1,10 @@
 #include "DBTestSupport.h"
 
+#include <poll.h>
+#include <sqlite3.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
 #include "DBController.h"
 #include "FileUtil.h"
 #include "WeatherDefine.h"
@@ -129,6 +134,50 @@ CityPtr MakeCity(const std::string& locationId, int seed, bool isCurrentLocation
     }
     city->SetMoonPhasePtrVector(moon);
     return city;
+}
+
+LockHolder::LockHolder(const std::vector<std::string>& paths, const char* lock, int holdMs)
+{
+    int ready[2];
+    if (pipe(ready) != 0 || pipe(mRelease) != 0)
+        return;
+    mPid = fork();
+    if (mPid == 0)
+    {
+        close(mRelease[1]);
+        char ok = 'L';
+        for (const std::string& path : paths)
+        {
+            sqlite3* db = nullptr;  // kept open until the child exits
+            if (sqlite3_open_v2(path.c_str(), &db, SQLITE_OPEN_READWRITE, nullptr) != SQLITE_OK ||
+                sqlite3_exec(db, lock, nullptr, nullptr, nullptr) != SQLITE_OK)
+                ok = 'F';
+        }
+        (void)!write(ready[1], &ok, 1);
+        struct pollfd pfd = {mRelease[0], POLLIN, 0};
+        poll(&pfd, 1, holdMs);
+        _exit(0);
+    }
+    close(ready[1]);
+    close(mRelease[0]);
+    char byte = 0;
+    mIsLocked = mPid > 0 && read(ready[0], &byte, 1) == 1 && byte == 'L';
+    close(ready[0]);
+}
+
+LockHolder::~LockHolder()
+{
+    Release();
+    int status = 0;
+    if (mPid > 0)
+        waitpid(mPid, &status, 0);
+}
+
+void LockHolder::Release()
+{
+    if (mRelease[1] >= 0)
+        close(mRelease[1]);
+    mRelease[1] = -1;
 }
 
 }  // namespace WeatherTest

@@ -73,7 +73,7 @@ TEST_F(SettingDBControllerTest, EveryColumnRoundTrips)
     s->SetDaemonType("OTHER_DAEMON");
     s->SetIsSupportManualRefresh(true);
     s->SetRefreshingStartTime(2000000004);
-    SettingDBController().Update(s);
+    ASSERT_EQ(ERR_OK, SettingDBController().Update(s));
     SettingPtr read = SettingDBController().Select();
     ASSERT_TRUE(read);
     EXPECT_EQ(Describe(*s), Describe(*read));
@@ -84,7 +84,7 @@ TEST_F(SettingDBControllerTest, EveryColumnRoundTrips)
                       &Setting::SetNetworkPositionPopupAgreement, &Setting::SetChinaDataGPSPerformPopupOn,
                       &Setting::SetIsNowRefreshing})
         ((*s).*flip)(flip != &Setting::SetAutoRefreshOn);
-    SettingDBController().Update(s);
+    ASSERT_EQ(ERR_OK, SettingDBController().Update(s));
     EXPECT_EQ(Describe(*s), Describe(*SettingDBController().Select()));
     EXPECT_EQ(1, RawDB(SettingDBPath()).QueryInt("SELECT COUNT(*) FROM SETTING_TABLE"));
 }
@@ -107,11 +107,11 @@ TEST_F(SettingDBControllerTest, NullRecordWritesNothingAndDisplayCityWritesOneCo
     InitializeSettings();
     SetSettingColumn("CpType", "'Kweather'");
     std::string before = WeatherTest::ReadText(SettingDBPath());
-    SettingDBController().Update(nullptr);
+    EXPECT_EQ(ERR_FAIL, SettingDBController().Update(nullptr));
     EXPECT_EQ(before, WeatherTest::ReadText(SettingDBPath()));
     EXPECT_TRUE(mLog.Contains("(!settingPtr) [return]")) << mLog.Dump();
 
-    SettingDBController().UpdateLocationIdOfDisplayCity("2-226396_1_AL");
+    EXPECT_EQ(ERR_OK, SettingDBController().UpdateLocationIdOfDisplayCity("2-226396_1_AL"));
     SettingPtr read = SettingDBController().Select();
     ASSERT_TRUE(read);
     EXPECT_EQ("2-226396_1_AL", read->GetCurrentCityLocationId());
@@ -126,68 +126,6 @@ TEST_F(SettingDBControllerTest, MissingDatabaseIsNeitherReadNorCreated)
     EXPECT_FALSE(SettingDBController().Select());
     EXPECT_TRUE(mLog.Contains("/.setting.db for reading")) << mLog.Dump();
     EXPECT_FALSE(SettingsTest::FileExists(SettingDBPath()));
-}
-
-// A child process that reads the row, waits for its turn, changes it with
-// `change` and writes the whole row back.
-struct Writer
-{
-    pid_t pid = -1;
-    int ready[2] = {-1, -1};
-    int go[2] = {-1, -1};
-
-    void Start(void (*change)(Setting&))
-    {
-        ASSERT_EQ(0, pipe(ready));
-        ASSERT_EQ(0, pipe(go));
-        pid = fork();
-        ASSERT_GE(pid, 0);
-        if (pid == 0)
-        {
-            SettingPtr settingPtr = SettingDBController().Select();
-            char byte = 'r';
-            if (!settingPtr || write(ready[1], &byte, 1) != 1 || read(go[0], &byte, 1) != 1)
-                _exit(2);
-            change(*settingPtr);
-            SettingDBController().Update(settingPtr);
-            _exit(0);
-        }
-        char byte = 0;
-        ASSERT_EQ(1, read(ready[0], &byte, 1));
-    }
-
-    int Finish()
-    {
-        char byte = 'g';
-        int status = -1;
-        bool ok = write(go[1], &byte, 1) == 1 && waitpid(pid, &status, 0) == pid;
-        for (int fd : {ready[0], ready[1], go[0], go[1]}) close(fd);
-        return ok && WIFEXITED(status) ? WEXITSTATUS(status) : -1;
-    }
-};
-
-TEST_F(SettingDBControllerTest, LaterWriterOfTwoProcessesWinsEveryColumn)
-{
-    InitializeSettings();
-    Writer first;
-    Writer second;
-    first.Start(
-        [](Setting& s)
-        {
-            s.SetTemperatureUnit(0);
-            s.SetCpType("Kweather");
-        });
-    second.Start([](Setting& s) { s.SetCpType("cmaweather"); });
-    EXPECT_EQ(0, first.Finish());
-    EXPECT_EQ("Kweather", SettingDBController().Select()->GetCpType());
-    EXPECT_EQ(0, second.Finish());
-
-    // The second read the row before the first wrote: the unit change is gone.
-    SettingPtr read = SettingDBController().Select();
-    ASSERT_TRUE(read);
-    EXPECT_EQ("cmaweather", read->GetCpType());
-    EXPECT_EQ(1, read->GetTemperatureUnit());
-    EXPECT_EQ(1, RawDB(SettingDBPath()).QueryInt("SELECT COUNT(*) FROM SETTING_TABLE"));
 }
 
 // Another process writes one column while the read-change-write is between
