@@ -87,8 +87,8 @@ double SampleWeatherSource::Front(uint64_t seed, time_t when)
 double SampleWeatherSource::MeanTemperature(double latitude, time_t when)
 {
     double absLat = std::fabs(latitude);
-    double annual = 27.0 - 0.45 * std::max(0.0, absLat - 12.0);
-    double amplitude = std::min(20.0, 0.4 * absLat);
+    double annual = 27.0 - 0.42 * std::max(0.0, absLat - 12.0);
+    double amplitude = std::min(16.0, 0.32 * absLat);
     double season = std::cos(2.0 * PI * (SunCalculator::GetDayOfYear(when) - 200) / 365.25);
     return annual + (latitude >= 0 ? season : -season) * amplitude;
 }
