@@ -145,8 +145,7 @@ TEST_F(FileUtilTest, MakeDirectoryReportsBadPaths)
     const std::string orphan = mRoot.Path("no/such/parent");
     EXPECT_FALSE(FileUtil::MakeDirectory(orphan));
     EXPECT_FALSE(IsDirectory(orphan));
-    EXPECT_TRUE(mLog.Contains("mkdir failed(path:" + orphan + "), errno:2", "weather-common"))
-        << mLog.Dump();
+    EXPECT_TRUE(mLog.Contains("mkdir failed(path:" + orphan + "), errno:2", "weather-common")) << mLog.Dump();
 }
 
 }  // namespace

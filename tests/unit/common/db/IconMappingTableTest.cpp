@@ -5,15 +5,15 @@
 
 #include "DBController.h"
 #include "IconMappingTable.h"
-#include "SettingsTestSupport.h"
+#include "DBTestSupport.h"
 
 using namespace NSWeather;
-using SettingsTest::RawDB;
+using WeatherTest::RawDB;
 
 namespace
 {
 
-class IconMappingTableTest : public SettingsTest::SettingsFixture
+class IconMappingTableTest : public WeatherTest::StoreTest
 {
 protected:
     void SetUp() override { InitializeSettings(); }
@@ -143,7 +143,7 @@ TEST_F(WeatherNewsIconTest, MissingDatabaseIsReportedAndNotCreated)
     std::string iconDB = mRoot.Path("apps/com.quorvex.weather-m-widget/res/data/weathernews_icon.db");
     EXPECT_EQ(0, Map(100, true));
     EXPECT_TRUE(mLog.Contains("sqlite3_open_open failed.")) << mLog.Dump();
-    EXPECT_FALSE(SettingsTest::FileExists(iconDB));
+    EXPECT_FALSE(WeatherTest::FileExists(iconDB));
 
     // An empty file in its place has no icon table.
     mkdir(mRoot.Path("apps/com.quorvex.weather-m-widget/res/data").c_str(), 0755);

@@ -3,6 +3,7 @@
 #include <app_control_launch.h>
 #include <gtest/gtest.h>
 
+#include <array>
 #include <cstdio>
 #include <functional>
 #include <string>
@@ -21,25 +22,8 @@ const char* const kAgent = "com.quorvex.weather-m-agent";
 const char* const kApp = "com.quorvex.weather-m";
 const char* const kPort = "com.quorvex.weather-m-widget.message.port.local";
 
-// The target and extra data of one launch.log line.
-struct Launch
-{
-    std::string appId;
-    std::string operation;
-    std::string uri;
-    std::string extra;
-
-    bool operator==(const Launch& other) const
-    {
-        return appId == other.appId && operation == other.operation && uri == other.uri &&
-               extra == other.extra;
-    }
-};
-
-std::ostream& operator<<(std::ostream& out, const Launch& launch)
-{
-    return out << launch.appId << " | " << launch.operation << " | " << launch.uri << " | " << launch.extra;
-}
+// App id, operation, uri and extra data of one launch.log line.
+using Launch = std::array<std::string, 4>;
 
 std::string Field(const std::string& line, const std::string& name, char end)
 {
@@ -89,57 +73,58 @@ protected:
     AppLauncher mLauncher;
 };
 
-TEST_F(AppLauncherTest, AgentRequestsCarryTheirCommandsInOrder)
+// What each request launches, in order; one launcher for all, as every
+// request builds and drops its own handle.
+TEST_F(AppLauncherTest, EachRequestLaunchesItsTargetWithItsExtraData)
 {
-    struct Case
+    const std::string port = std::string("{\"PORT_ID\":\"") + kPort + "\",";
+    const std::string loc = APP_CONTROL_LOCATION_SETTING_APP_ID;
+    const std::string setLoc = APP_CONTROL_OPERATION_SETTING_LOCATION;
+    const struct
     {
         std::function<int(AppLauncher&)> request;
-        std::string extra;
-    };
-    const std::vector<Case> cases = {
+        Launch launch;
+    } cases[] = {
         {[](AppLauncher& l) { return l.RequestRefreshToAgent(); },
-         "{\"MESSAGE\":\"REQUEST_ALL_WEATHER_INFO\"}"},
+         {kAgent, "", "", "{\"MESSAGE\":\"REQUEST_ALL_WEATHER_INFO\"}"}},
         {[](AppLauncher& l) { return l.RequestWeatherInfoWithLocationIdToAgent("cityA"); },
-         "{\"MESSAGE\":\"REQUEST_WEATHER_INFO_WITH_LOCATION_ID\",\"locationId\":\"cityA\"}"},
+         {kAgent, "", "",
+          "{\"MESSAGE\":\"REQUEST_WEATHER_INFO_WITH_LOCATION_ID\",\"locationId\":\"cityA\"}"}},
         {[](AppLauncher& l) { return l.RequestWeatherInfoWithLocationIdForAddToAgent(kPort, "cityB"); },
-         std::string("{\"PORT_ID\":\"") + kPort +
-             "\",\"MESSAGE\":\"REQUEST_WEATHER_INFO_WITH_LOCATION_ID_FOR_ADD\",\"locationId\":\"cityB\"}"},
+         {kAgent, "", "",
+          port + "\"MESSAGE\":\"REQUEST_WEATHER_INFO_WITH_LOCATION_ID_FOR_ADD\",\"locationId\":\"cityB\"}"}},
         {[](AppLauncher& l)
          { return l.RequestWeatherInfoWithCurrentLocationIdForAddToAgent(kPort, "cityC"); },
-         std::string("{\"PORT_ID\":\"") + kPort +
-             "\",\"MESSAGE\":\"REQUEST_WEATHER_INFO_WITH_CURRENT_LOCATION_ID_FOR_ADD\",\"locationId\":"
-             "\"cityC\"}"},
+         {kAgent, "", "",
+          port + "\"MESSAGE\":\"REQUEST_WEATHER_INFO_WITH_CURRENT_LOCATION_ID_FOR_ADD\",\"locationId\":"
+                 "\"cityC\"}"}},
         {[](AppLauncher& l) { return l.RequestCurrentLocationWeatherInfoForSimpleAddProcessToAgent(kPort); },
-         std::string("{\"PORT_ID\":\"") + kPort +
-             "\",\"MESSAGE\":\"REQUEST_CURRENT_LOCATION_WEATHER_INFO_FOR_SIMPLE_ADD_PROCESS\"}"},
+         {kAgent, "", "",
+          port + "\"MESSAGE\":\"REQUEST_CURRENT_LOCATION_WEATHER_INFO_FOR_SIMPLE_ADD_PROCESS\"}"}},
         {[](AppLauncher& l) { return l.RequestSetNowRefreshingToAgent(true); },
-         "{\"MESSAGE\":\"SET_NOW_REFRESHING\",\"refreshing\":\"true\"}"},
+         {kAgent, "", "", "{\"MESSAGE\":\"SET_NOW_REFRESHING\",\"refreshing\":\"true\"}"}},
         {[](AppLauncher& l) { return l.RequestSetNowRefreshingToAgent(false); },
-         "{\"MESSAGE\":\"SET_NOW_REFRESHING\",\"refreshing\":\"false\"}"},
+         {kAgent, "", "", "{\"MESSAGE\":\"SET_NOW_REFRESHING\",\"refreshing\":\"false\"}"}},
         {[](AppLauncher& l) { return l.RequestSetLocationIdOfDisplayCityToAgent("cityD"); },
-         "{\"MESSAGE\":\"SET_LOCATIONID_OF_DISPLAY_CITY\",\"locationId\":\"cityD\"}"},
+         {kAgent, "", "", "{\"MESSAGE\":\"SET_LOCATIONID_OF_DISPLAY_CITY\",\"locationId\":\"cityD\"}"}},
         {[](AppLauncher& l) { return l.RequestCancelAllRequest(); },
-         "{\"MESSAGE\":\"REQUEST_CANCEL_ALL_REQUEST\"}"},
+         {kAgent, "", "", "{\"MESSAGE\":\"REQUEST_CANCEL_ALL_REQUEST\"}"}},
+        {[](AppLauncher& l) { return l.RequestLaunchApplication(); }, {kApp, "", "", "{}"}},
+        {[](AppLauncher& l) { return l.RequestLaunchApplicationWithLocationId("cityA"); },
+         {kApp, "", "", "{\"LOCATION_ID\":\"cityA\"}"}},
+        {[](AppLauncher& l) { return l.RequestLaunchApplicationWithLocationId(""); }, {kApp, "", "", "{}"}},
+        {[](AppLauncher& l) { return l.RequestLaunchApplicationForAddCity(); },
+         {kApp, "", "", "{\"MODE\":\"ADD_CITY\"}"}},
+        {[](AppLauncher& l) { return l.LaunchSetting("", APP_CONTROL_OPERATION_SETTING_LOCATION); },
+         {loc, setLoc, "", "{}"}},
+        {[](AppLauncher& l) { return l.LaunchSetting(kApp, "custom.operation"); },
+         {kApp, "custom.operation", "", "{}"}},
+        {[](AppLauncher& l) { return l.LaunchGPSSetting(); }, {loc, setLoc, "", "{}"}},
     };
-    // One launcher for all: every request builds and drops its own handle.
-    for (const Case& item : cases) EXPECT_EQ(0, item.request(mLauncher)) << item.extra;
+    for (const auto& c : cases) EXPECT_EQ(0, c.request(mLauncher)) << c.launch[3];
     std::vector<Launch> launches = Launches();
-    ASSERT_EQ(cases.size(), launches.size());
-    for (size_t i = 0; i < cases.size(); ++i)
-        EXPECT_EQ((Launch{kAgent, "", "", cases[i].extra}), launches[i]);
-}
-
-TEST_F(AppLauncherTest, WeatherApplicationRequests)
-{
-    EXPECT_EQ(0, mLauncher.RequestLaunchApplication());
-    EXPECT_EQ(0, mLauncher.RequestLaunchApplicationWithLocationId("cityA"));
-    EXPECT_EQ(0, mLauncher.RequestLaunchApplicationWithLocationId(""));
-    EXPECT_EQ(0, mLauncher.RequestLaunchApplicationForAddCity());
-    std::vector<Launch> expected = {{kApp, "", "", "{}"},
-                                    {kApp, "", "", "{\"LOCATION_ID\":\"cityA\"}"},
-                                    {kApp, "", "", "{}"},
-                                    {kApp, "", "", "{\"MODE\":\"ADD_CITY\"}"}};
-    EXPECT_EQ(expected, Launches());
+    ASSERT_EQ(std::size(cases), launches.size());
+    for (size_t i = 0; i < launches.size(); ++i) EXPECT_EQ(cases[i].launch, launches[i]);
 }
 
 TEST_F(AppLauncherTest, BrowserGetsTheUrlAndAccuWeatherIsCounted)
@@ -158,16 +143,6 @@ TEST_F(AppLauncherTest, BrowserGetsTheUrlAndAccuWeatherIsCounted)
     EXPECT_EQ(expected, Launches());
 }
 
-TEST_F(AppLauncherTest, PreconditionsStopBeforeAnyRequest)
-{
-    EXPECT_EQ(-1, mLauncher.RequestSetLocationIdOfDisplayCityToAgent(""));
-    EXPECT_TRUE(mLog.Contains("(locationId.length() < 1) [return]", "weather-ui-common")) << mLog.Dump();
-    EXPECT_EQ(-1, mLauncher.LaunchSetting("some.app", ""));
-    EXPECT_TRUE(mLog.Contains("(operation.length() < 1) [return]", "weather-ui-common"));
-    EXPECT_TRUE(Launches().empty());
-    EXPECT_FALSE(mLog.Contains("[Fail]"));
-}
-
 TEST_F(AppLauncherTest, FailedSendStillDropsTheHandle)
 {
     // The agent is not installed.
@@ -182,29 +157,20 @@ TEST_F(AppLauncherTest, FailedSendStillDropsTheHandle)
     // The same launcher goes on with a fresh handle.
     EXPECT_EQ(0, mLauncher.RequestLaunchApplicationForAddCity());
     ASSERT_EQ(1u, Launches().size());
-    EXPECT_EQ("{\"MODE\":\"ADD_CITY\"}", Launches()[0].extra);
+    EXPECT_EQ("{\"MODE\":\"ADD_CITY\"}", Launches()[0][3]);
 }
 
-TEST_F(AppLauncherTest, RefusedExtraDataAbortsTheRequest)
+// Bad arguments, and values the platform refuses, launch nothing.
+TEST_F(AppLauncherTest, RefusedRequestsLaunchNothing)
 {
-    // The platform refuses empty values, so nothing is launched.
+    EXPECT_EQ(-1, mLauncher.RequestSetLocationIdOfDisplayCityToAgent(""));
+    EXPECT_EQ(-1, mLauncher.LaunchSetting("some.app", ""));
+    EXPECT_EQ(-1, mLauncher.LaunchSetting("", "unknown.operation"));
     EXPECT_EQ(-1, mLauncher.RequestWeatherInfoWithLocationIdToAgent(""));
     EXPECT_TRUE(mLog.Contains("[Fail] app_control_add_extra_data(" +
-                              std::to_string(APP_CONTROL_ERROR_INVALID_PARAMETER) + ")"));
+                              std::to_string(APP_CONTROL_ERROR_INVALID_PARAMETER) + ")"))
+        << mLog.Dump();
     EXPECT_TRUE(Launches().empty());
-}
-
-TEST_F(AppLauncherTest, SettingsLaunches)
-{
-    EXPECT_EQ(0, mLauncher.LaunchSetting("", APP_CONTROL_OPERATION_SETTING_LOCATION));
-    EXPECT_EQ(0, mLauncher.LaunchSetting(kApp, "custom.operation"));
-    EXPECT_EQ(0, mLauncher.LaunchGPSSetting());
-    EXPECT_EQ(-1, mLauncher.LaunchSetting("", "unknown.operation"));
-    std::vector<Launch> expected = {
-        {APP_CONTROL_LOCATION_SETTING_APP_ID, APP_CONTROL_OPERATION_SETTING_LOCATION, "", "{}"},
-        {kApp, "custom.operation", "", "{}"},
-        {APP_CONTROL_LOCATION_SETTING_APP_ID, APP_CONTROL_OPERATION_SETTING_LOCATION, "", "{}"}};
-    EXPECT_EQ(expected, Launches());
 }
 
 }  // namespace
