@@ -92,25 +92,17 @@ CityPtr MakeCity(const std::string& locationId, int seed, bool isCurrentLocation
     extra->SetHumidity(60 + seed);
     extra->SetSunsetTime(1700050000);
     extra->SetSunriseTime(1700010000);
-    extra->SetPm25(21);
-    extra->SetPm10(22);
-    extra->SetAqi(23);
-    extra->SetUvIndex(24);
-    extra->SetOutdoorExcercise(1);
-    extra->SetComfort(2);
-    extra->SetClothing(3);
-    extra->SetSkincare(4);
-    extra->SetCarwash(5);
-    extra->SetFoodPoison(6);
-    extra->SetHeat(7);
-    extra->SetSpoiledFood(8);
-    extra->SetDiscomfort(9);
-    extra->SetFrozenPipes(10);
-    extra->SetFrostbite(11);
-    extra->SetCold(12);
-    extra->SetPollen(13);
-    extra->SetAirDust(14);
-    extra->SetDrySkin(15);
+    // Distinct values, so that two swapped columns show.
+    int value = 21;
+    for (auto set : {&Extra::SetPm25, &Extra::SetPm10, &Extra::SetAqi, &Extra::SetUvIndex})
+        ((*extra).*set)(value++);
+    value = 1;
+    for (auto set :
+         {&Extra::SetOutdoorExcercise, &Extra::SetComfort, &Extra::SetClothing, &Extra::SetSkincare,
+          &Extra::SetCarwash, &Extra::SetFoodPoison, &Extra::SetHeat, &Extra::SetSpoiledFood,
+          &Extra::SetDiscomfort, &Extra::SetFrozenPipes, &Extra::SetFrostbite, &Extra::SetCold,
+          &Extra::SetPollen, &Extra::SetAirDust, &Extra::SetDrySkin})
+        ((*extra).*set)(value++);
     extra->GetRealfeel()->SetCelsiusValue(999.0);
     extra->GetPrecipitationPtr()->SetPrecType(2);
     extra->GetPrecipitationPtr()->SetPrecProbability(0.35);
