@@ -1,13 +1,23 @@
 #include "DBTestSupport.h"
 
+#include <sstream>
+
 #include <poll.h>
 #include <sqlite3.h>
+#include <sys/stat.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include "CityDBController.h"
+#include "CurrentWeatherDBController.h"
 #include "DBController.h"
+#include "ExtraWeatherDBController.h"
 #include "FileUtil.h"
+#include "HourlyWeatherDBController.h"
+#include "MoonPhaseDBController.h"
+#include "SettingDBController.h"
 #include "WeatherDefine.h"
+#include "WeeklyWeatherDBController.h"
 
 using namespace NSWeather;
 
@@ -16,19 +26,8 @@ namespace WeatherTest
 
 void DBTest::SetUp()
 {
-    FileUtil::ClearCache();
-    FileUtil::MakeDirectory(DBDir());
+    MakeDBDir();
     ASSERT_EQ(DBController().Initialize(), ERR_OK) << mLog.Dump();
-}
-
-std::string DBTest::DBDir() const
-{
-    return mRoot.SharedDataDir() + "db";
-}
-
-std::string DBTest::WeatherDBPath() const
-{
-    return mRoot.SharedDataDir() + "db/.weather.db";
 }
 
 CityPtr MakeCity(const std::string& locationId, int seed, bool isCurrentLocation)
@@ -93,25 +92,17 @@ CityPtr MakeCity(const std::string& locationId, int seed, bool isCurrentLocation
     extra->SetHumidity(60 + seed);
     extra->SetSunsetTime(1700050000);
     extra->SetSunriseTime(1700010000);
-    extra->SetPm25(11);
-    extra->SetPm10(12);
-    extra->SetAqi(13);
-    extra->SetUvIndex(4);
-    extra->SetOutdoorExcercise(1);
-    extra->SetComfort(2);
-    extra->SetClothing(3);
-    extra->SetSkincare(4);
-    extra->SetCarwash(5);
-    extra->SetFoodPoison(6);
-    extra->SetHeat(7);
-    extra->SetSpoiledFood(8);
-    extra->SetDiscomfort(9);
-    extra->SetFrozenPipes(10);
-    extra->SetFrostbite(11);
-    extra->SetCold(12);
-    extra->SetPollen(13);
-    extra->SetAirDust(14);
-    extra->SetDrySkin(15);
+    // Distinct values, so that two swapped columns show.
+    int value = 21;
+    for (auto set : {&Extra::SetPm25, &Extra::SetPm10, &Extra::SetAqi, &Extra::SetUvIndex})
+        ((*extra).*set)(value++);
+    value = 1;
+    for (auto set :
+         {&Extra::SetOutdoorExcercise, &Extra::SetComfort, &Extra::SetClothing, &Extra::SetSkincare,
+          &Extra::SetCarwash, &Extra::SetFoodPoison, &Extra::SetHeat, &Extra::SetSpoiledFood,
+          &Extra::SetDiscomfort, &Extra::SetFrozenPipes, &Extra::SetFrostbite, &Extra::SetCold,
+          &Extra::SetPollen, &Extra::SetAirDust, &Extra::SetDrySkin})
+        ((*extra).*set)(value++);
     extra->GetRealfeel()->SetCelsiusValue(999.0);
     extra->GetPrecipitationPtr()->SetPrecType(2);
     extra->GetPrecipitationPtr()->SetPrecProbability(0.35);
@@ -134,6 +125,70 @@ CityPtr MakeCity(const std::string& locationId, int seed, bool isCurrentLocation
     }
     city->SetMoonPhasePtrVector(moon);
     return city;
+}
+
+namespace
+{
+void Describe(std::ostream& out, const TemperaturePtr& t)
+{
+    // Celsius only: the store keeps Celsius, Fahrenheit is derived again on reading.
+    out << (t ? std::to_string(t->GetCelsius()) : "-") << '|';
+}
+
+void Describe(std::ostream& out, const Weather& w)
+{
+    out << w.GetWeatherIcon() << '|' << w.GetWeatherStatus() << '|' << w.GetDate() << '|';
+    Describe(out, w.GetCurTemperature());
+    Describe(out, w.GetLowTemperature());
+    Describe(out, w.GetHighTemperature());
+}
+}  // namespace
+
+std::string DescribeCity(const City& c)
+{
+    std::ostringstream out;
+    out.precision(12);
+    out << c.GetPageIndex() << '|' << c.GetLocationId() << '|' << c.GetCityName() << '|' << c.GetCityNameEng()
+        << '|' << c.GetCountryName() << '|' << c.GetCountryNameEng() << '|' << c.GetIsCurrentLocation()
+        << c.GetIsDayTime() << c.GetIsSummerTime() << '|' << c.GetGmtOffset() << '|' << c.GetRefreshedTime()
+        << '|' << c.GetLocalTime() << '|' << c.GetWidgetReferenceCount() << '|' << c.GetNeedToUpdate() << '|'
+        << c.GetWebsiteUrl() << "\ncurrent ";
+    if (CurrentPtr current = c.GetCurrentPtr())
+    {
+        Describe(out, *current);
+        out << current->GetWebsiteUrl();
+    }
+    for (const WeeklyPtr& day : *c.GetWeeklyPtrVector())
+    {
+        out << "\nday ";
+        Describe(out, *day);
+        out << day->GetWebsiteUrl();
+    }
+    for (const HourlyPtr& hour : *c.GetHourlyPtrVector())
+    {
+        out << "\nhour " << hour->GetHour() << '|';
+        Describe(out, *hour);
+        out << hour->GetWebsiteUrl();
+    }
+    if (ExtraPtr e = c.GetExtraPtr())
+    {
+        out << "\nextra " << e->GetHumidity() << '|' << e->GetSunsetTime() << '|' << e->GetSunriseTime();
+        for (int index :
+             {e->GetPm25(), e->GetPm10(), e->GetAqi(), e->GetUvIndex(), e->GetOutdoorExcercise(),
+              e->GetComfort(), e->GetClothing(), e->GetSkincare(), e->GetCarwash(), e->GetFoodPoison(),
+              e->GetHeat(), e->GetSpoiledFood(), e->GetDiscomfort(), e->GetFrozenPipes(), e->GetFrostbite(),
+              e->GetCold(), e->GetPollen(), e->GetAirDust(), e->GetDrySkin()})
+            out << ',' << index;
+        out << '|';
+        Describe(out, e->GetRealfeel());
+        PrecipitationPtr p = e->GetPrecipitationPtr();
+        out << p->GetPrecType() << '|' << p->GetPrecProbability() << '|' << p->GetPrecAmount() << '|'
+            << p->GetPrecProbabilityNight() << '|' << p->GetPrecAmountNight();
+    }
+    for (const MoonPhasePtr& moon : *c.GetMoonPhasePtrVector())
+        out << "\nmoon " << moon->GetLocationID() << '|' << moon->GetDate() << '|' << moon->GetMoonRiseTime()
+            << '|' << moon->GetMoonSetTime() << '|' << moon->GetPhaseText() << '|' << moon->GetAge();
+    return out.str();
 }
 
 LockHolder::LockHolder(const std::vector<std::string>& paths, const char* lock, int holdMs)
@@ -178,6 +233,130 @@ void LockHolder::Release()
     if (mRelease[1] >= 0)
         close(mRelease[1]);
     mRelease[1] = -1;
+}
+
+const std::pair<const char*, const char*> WEATHER_TABLE_FORMATS[6] = {
+    {CityDBController::TABLE_NAME, CityDBController::CREATE_TABLE_FORMAT},
+    {CurrentWeatherDBController::TABLE_NAME, CurrentWeatherDBController::CREATE_TABLE_FORMAT},
+    {HourlyWeatherDBController::TABLE_NAME, HourlyWeatherDBController::CREATE_TABLE_FORMAT},
+    {WeeklyWeatherDBController::TABLE_NAME, WeeklyWeatherDBController::CREATE_TABLE_FORMAT},
+    {ExtraWeatherDBController::TABLE_NAME, ExtraWeatherDBController::CREATE_TABLE_FORMAT},
+    {MoonPhaseDBController::TABLE_NAME, MoonPhaseDBController::CREATE_TABLE_FORMAT},
+};
+
+namespace
+{
+// Columns that each schema version added to the weather tables.
+struct AddedColumn
+{
+    const char* table;
+    const char* column;
+    double version;
+};
+
+const AddedColumn ADDED_COLUMNS[] = {
+    {"CITY_TABLE", "countryNameEng", 0.1},
+    {"HOURLY_WEATHER_TABLE", "websiteUrl", 0.2},
+    {"EXTRA_WEATHER_TABLE", "aqi", 0.3},
+    {"EXTRA_WEATHER_TABLE", "pm25", 0.3},
+    {"EXTRA_WEATHER_TABLE", "outdoorExcercise", 0.4},
+    {"EXTRA_WEATHER_TABLE", "comfort", 0.4},
+    {"EXTRA_WEATHER_TABLE", "clothing", 0.4},
+    {"EXTRA_WEATHER_TABLE", "skincare", 0.4},
+    {"EXTRA_WEATHER_TABLE", "carwash", 0.4},
+    {"CITY_TABLE", "needToUpdate", 0.5},
+    {"EXTRA_WEATHER_TABLE", "foodPoison", 0.6},
+    {"EXTRA_WEATHER_TABLE", "heat", 0.6},
+    {"EXTRA_WEATHER_TABLE", "spoiledFood", 0.6},
+    {"EXTRA_WEATHER_TABLE", "discomfort", 0.6},
+    {"EXTRA_WEATHER_TABLE", "frozenPipes", 0.6},
+    {"EXTRA_WEATHER_TABLE", "frostbite", 0.6},
+    {"EXTRA_WEATHER_TABLE", "cold", 0.6},
+    {"EXTRA_WEATHER_TABLE", "pollen", 0.6},
+    {"EXTRA_WEATHER_TABLE", "airDust", 0.6},
+    {"EXTRA_WEATHER_TABLE", "drySkin", 0.6},
+    {"CITY_TABLE", "isSummerTime", 0.7},
+    {"EXTRA_WEATHER_TABLE", "precProbabilityNight", 0.8},
+    {"EXTRA_WEATHER_TABLE", "precAmountNight", 0.8},
+};
+
+bool IsAddedAfter(const std::string& table, const std::string& column, double version)
+{
+    for (const AddedColumn& added : ADDED_COLUMNS)
+        if (table == added.table && column == added.column && version < added.version)
+            return true;
+    return false;
+}
+
+std::string Replace(std::string text, const std::string& from, const std::string& to)
+{
+    size_t pos = text.find(from);
+    if (pos != std::string::npos)
+        text.replace(pos, from.size(), to);
+    return text;
+}
+}  // namespace
+
+std::string StoredCreateSql(const std::string& format, const std::string& table)
+{
+    std::string sql = Replace(Replace(format, "IF NOT EXISTS ", ""), "%s", table);
+    if (!sql.empty() && sql.back() == ';')
+        sql.pop_back();
+    return sql;
+}
+
+std::string OldWeatherTableSql(const std::string& table, double version)
+{
+    std::string format;
+    for (const auto& entry : WEATHER_TABLE_FORMATS)
+        if (table == entry.first)
+            format = entry.second;
+    std::string sql = StoredCreateSql(format, table);
+    size_t open = sql.find('(');
+    std::string body = sql.substr(open + 1, sql.size() - open - 2);
+    std::string kept;
+    std::stringstream pieces(body);
+    for (std::string piece; std::getline(pieces, piece, ',');)
+    {
+        std::string name = piece.substr(0, piece.find_first_of(" \t"));
+        if (IsAddedAfter(table, name, version))
+            continue;
+        kept += (kept.empty() ? "" : ",") + piece;
+    }
+    return sql.substr(0, open + 1) + kept + ")";
+}
+
+bool FileExists(const std::string& path)
+{
+    struct stat st;
+    return stat(path.c_str(), &st) == 0;
+}
+
+StoreTest::StoreTest()
+{
+    NSWeather::FileUtil::ClearCache();
+}
+
+StoreTest::~StoreTest()
+{
+    NSWeather::FileUtil::ClearCache();
+}
+
+void StoreTest::MakeDBDir() const
+{
+    mkdir(DBDir().c_str(), 0755);
+}
+
+void StoreTest::InitializeSettings() const
+{
+    MakeDBDir();
+    ASSERT_EQ(NSWeather::ERR_OK, NSWeather::SettingDBController().Initialize());
+}
+
+void StoreTest::SetSettingColumn(const std::string& column, const std::string& sqlValue) const
+{
+    RawDB db(SettingDBPath());
+    db.Exec("UPDATE SETTING_TABLE SET " + column + " = " + sqlValue);
 }
 
 }  // namespace WeatherTest

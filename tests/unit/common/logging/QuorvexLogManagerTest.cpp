@@ -62,70 +62,46 @@ protected:
     QuorvexLogManager* mManager = QuorvexLogManager::GetInstance();
 };
 
-TEST_F(QuorvexLogManagerTest, NothingIsSentBeforeCreate)
+// Only a created manager sends; a second Create keeps the one handle.
+TEST_F(QuorvexLogManagerTest, SendsOnlyBetweenCreateAndDestroy)
 {
     mManager->CollectLogByFeature(2005, 10, 0);
-    EXPECT_TRUE(mLog.Contains("(mQuorvexLogManager == NULL) [return]", "weather-common")) << mLog.Dump();
-    EXPECT_TRUE(Records().empty());
-
     mManager->Create();
+    mManager->Create();
+    mManager->CollectLogByFeature(2008, 13, 1);
     mManager->Destroy();
     mManager->CollectLogByFeature(2005, 10, 0);
-    EXPECT_TRUE(Records().empty());
-}
-
-TEST_F(QuorvexLogManagerTest, CreateTwiceKeepsTheFirstHandle)
-{
-    mManager->Create();
-    mManager->Create();
-    EXPECT_TRUE(mLog.Contains("(mQuorvexLogManager != NULL) [return]", "weather-common"));
-    mManager->CollectLogByFeature(2008, 13, 1);
     EXPECT_EQ(1u, Records().size());
 }
 
 TEST_F(QuorvexLogManagerTest, RecordsCarryTheirKeysAndValues)
 {
     mManager->Create();
-    mManager->CollectLogByFeature(2005, 10, 0);
-    mManager->CollectLogByFeature(2008, 15, 1, -1);
-    mManager->CollectLogByFeature(2008, 14, 1);
-    mManager->CollectLogByFeature(2009, 16, 0, 1);
-    mManager->CollectLogByFeature(2009, 16, 0, 0);
-    mManager->CollectLogByFeature(1, 0, 0, 7);
-    mManager->CollectLogByFeature(1, 0, 0, INT_MAX);
-
+    const struct
+    {
+        int feature, detail, uriType, value;
+        std::string uri, data;
+    } cases[] = {
+        {2005, 10, 0, 0, kFeatureUri, Data("2005", "enter_accuweather", "0")},
+        {2008, 15, 1, -1, kStatusUri, Data("2008", "added_widget_4x2", "0")},
+        {2008, 14, 1, 0, kStatusUri, Data("2008", "added_widget_4x4", "0")},
+        {2009, 16, 0, 1, kFeatureUri, Data("2009", "widget_alive", "1000")},
+        {1, 0, 0, 7, kFeatureUri, Data("1", "use_current_location_option", "7000")},
+        // Too large to scale: capped instead of overflowing.
+        {1, 0, 0, INT_MAX, kFeatureUri, Data("1", "use_current_location_option", "2147483000")},
+        // An unknown detail still sends, with an empty extra.
+        {2008, 17, 1, 0, kStatusUri, Data("2008", "", "0")},
+        // An unknown uri type is refused by the client: nothing stored.
+        {2005, 10, 2, 0, "", ""},
+    };
+    for (const auto& c : cases) mManager->CollectLogByFeature(c.feature, c.detail, c.uriType, c.value);
     std::vector<Record> records = Records();
-    ASSERT_EQ(7u, records.size());
-    EXPECT_EQ(kFeatureUri, records[0].uri);
-    EXPECT_EQ(Data("2005", "enter_accuweather", "0"), records[0].data);
-    EXPECT_EQ(kStatusUri, records[1].uri);
-    EXPECT_EQ(Data("2008", "added_widget_4x2", "0"), records[1].data);
-    EXPECT_EQ(Data("2008", "added_widget_4x4", "0"), records[2].data);
-    EXPECT_EQ(kFeatureUri, records[3].uri);
-    EXPECT_EQ(Data("2009", "widget_alive", "1000"), records[3].data);
-    EXPECT_EQ(Data("2009", "widget_alive", "0"), records[4].data);
-    EXPECT_EQ(Data("1", "use_current_location_option", "7000"), records[5].data);
-    // Too large to scale: capped instead of overflowing.
-    EXPECT_EQ(Data("1", "use_current_location_option", "2147483000"), records[6].data);
-}
-
-TEST_F(QuorvexLogManagerTest, UnknownDetailSendsAnEmptyExtra)
-{
-    mManager->Create();
-    mManager->CollectLogByFeature(2008, 17, 1);
-    mManager->CollectLogByFeature(2008, -1, 1);
-    std::vector<Record> records = Records();
-    ASSERT_EQ(2u, records.size());
-    EXPECT_EQ(Data("2008", "", "0"), records[0].data);
-    EXPECT_TRUE(mLog.Contains("Default error : 17"));
-    EXPECT_TRUE(mLog.Contains("Default error : -1"));
-}
-
-TEST_F(QuorvexLogManagerTest, UnknownUriTypeIsNotStored)
-{
-    mManager->Create();
-    mManager->CollectLogByFeature(2005, 10, 2);
-    EXPECT_TRUE(Records().empty());
+    ASSERT_EQ(std::size(cases) - 1, records.size());
+    for (size_t i = 0; i < records.size(); ++i)
+    {
+        EXPECT_EQ(cases[i].uri, records[i].uri) << i;
+        EXPECT_EQ(cases[i].data, records[i].data) << i;
+    }
     EXPECT_TRUE(mLog.Contains("quorvex_log_manager_insert failed : -22", "weather-common")) << mLog.Dump();
 }
 

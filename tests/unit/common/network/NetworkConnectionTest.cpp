@@ -45,8 +45,10 @@ TEST_F(NetworkConnectionTest, AvailabilityOfEachConnectionType)
     {
         int status;
         bool available;
-    } kCases[] = {{VCONFKEY_NETWORK_WIFI, true},       {VCONFKEY_NETWORK_CELLULAR, true},
-                  {VCONFKEY_NETWORK_ETHERNET, true},   {VCONFKEY_NETWORK_OFF, false},
+    } kCases[] = {{VCONFKEY_NETWORK_WIFI, true},
+                  {VCONFKEY_NETWORK_CELLULAR, true},
+                  {VCONFKEY_NETWORK_ETHERNET, true},
+                  {VCONFKEY_NETWORK_OFF, false},
                   {VCONFKEY_NETWORK_BLUETOOTH, false}};
     NetworkConnection connection;
     EXPECT_FALSE(connection.IsNetworkAvailable());
@@ -57,7 +59,9 @@ TEST_F(NetworkConnectionTest, AvailabilityOfEachConnectionType)
         mLog.Clear();
         ASSERT_EQ(vconf_set_int(VCONFKEY_NETWORK_STATUS, item.status), VCONF_OK);
         EXPECT_EQ(connection.IsNetworkAvailable(), item.available);
-        EXPECT_EQ(mLog.Count(item.available ? "network isAvailable:1" : "network isAvailable:0", "weather-common"), 1)
+        EXPECT_EQ(
+            mLog.Count(item.available ? "network isAvailable:1" : "network isAvailable:0", "weather-common"),
+            1)
             << mLog.Dump();
         EXPECT_EQ(mLog.Contains("connection type disconnected or bt connection. network connection type:"),
                   !item.available);

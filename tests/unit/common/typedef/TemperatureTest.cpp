@@ -27,10 +27,8 @@ TEST_P(TemperatureConversionTest, KeepsOneDecimalRoundedHalfUp)
 }
 
 INSTANTIATE_TEST_SUITE_P(Values, TemperatureConversionTest,
-                         ::testing::Values(Conversion{21.04, 21.0, 69.9},
-                                           Conversion{-2.25, -2.2, 28.0},
-                                           Conversion{-40.0, -40.0, -40.0},
-                                           Conversion{0.05, 0.1, 32.1},
+                         ::testing::Values(Conversion{21.04, 21.0, 69.9}, Conversion{-2.25, -2.2, 28.0},
+                                           Conversion{-40.0, -40.0, -40.0}, Conversion{0.05, 0.1, 32.1},
                                            Conversion{36.6, 36.6, 97.9},
                                            // Close to the sentinel but not it: converted.
                                            Conversion{999.04, 999.0, 1830.3}));

@@ -4,13 +4,13 @@
 #include "DataStoreInitializer.h"
 #include "IconMappingTable.h"
 #include "SettingDBController.h"
-#include "SettingsTestSupport.h"
+#include "DBTestSupport.h"
 #include "ShareTargetDBController.h"
 #include "VersionDBController.h"
 #include "WeatherDefine.h"
 
 using namespace NSWeather;
-using SettingsTest::RawDB;
+using WeatherTest::RawDB;
 
 namespace
 {
@@ -23,7 +23,7 @@ std::string RandomBytes(size_t size, unsigned seed)
     return bytes;
 }
 
-class BadInputTest : public SettingsTest::SettingsFixture
+class BadInputTest : public WeatherTest::StoreTest
 {
 protected:
     // Every reader of the settings gives its empty value.

@@ -80,7 +80,8 @@ TEST_F(TimeUtilTest, LocalTimeFollowsTheClockSetting)
     ExpectLongTextShiftedBy(MakeCity(0.0), NSWeather::CP_ACCUWEATHER, 0, ICUUtil::SKELETON_EEEdMMM_HHmm);
     // A device away from UTC still shows the city's own clock.
     mTz.Set("<+09>-9");
-    ExpectLongTextShiftedBy(MakeCity(2.0), NSWeather::CP_ACCUWEATHER, -7 * kHour, ICUUtil::SKELETON_EEEdMMM_HHmm);
+    ExpectLongTextShiftedBy(MakeCity(2.0), NSWeather::CP_ACCUWEATHER, -7 * kHour,
+                            ICUUtil::SKELETON_EEEdMMM_HHmm);
 }
 
 TEST_F(TimeUtilTest, MissingCityGivesEmptyTextAndNight)
@@ -140,8 +141,7 @@ TEST_F(TimeUtilTest, EachTimeKeyChangeReachesItsCallback)
     ASSERT_EQ(TimeUtil::RegisterRegionFormatTime1224ChangedCb(KeyChangedCb, &keys), VCONF_OK);
     const std::vector<std::string> kKeys = {VCONFKEY_REGIONFORMAT_TIME1224, VCONFKEY_SETAPPL_DATE_FORMAT_INT,
                                             VCONFKEY_SETAPPL_TIMEZONE_ID, VCONFKEY_SYSTEM_TIME_CHANGED};
-    for (const std::string& key : kKeys)
-        vconf_set_int(key.c_str(), 2);
+    for (const std::string& key : kKeys) vconf_set_int(key.c_str(), 2);
     EXPECT_TRUE(WeatherTest::RunLoopUntil([&] { return keys.size() == 4; }, 5.0));
     std::sort(keys.begin(), keys.end());
     EXPECT_EQ(keys, kKeys);

@@ -5,16 +5,16 @@
 #include <unistd.h>
 
 #include "SettingDBController.h"
-#include "SettingsTestSupport.h"
+#include "DBTestSupport.h"
 #include "WeatherDefine.h"
 
 using namespace NSWeather;
-using SettingsTest::RawDB;
+using WeatherTest::RawDB;
 
 namespace
 {
 
-class SettingDBControllerTest : public SettingsTest::SettingsFixture
+class SettingDBControllerTest : public WeatherTest::StoreTest
 {
 };
 
@@ -125,7 +125,7 @@ TEST_F(SettingDBControllerTest, MissingDatabaseIsNeitherReadNorCreated)
     MakeDBDir();
     EXPECT_FALSE(SettingDBController().Select());
     EXPECT_TRUE(mLog.Contains("/.setting.db for reading")) << mLog.Dump();
-    EXPECT_FALSE(SettingsTest::FileExists(SettingDBPath()));
+    EXPECT_FALSE(WeatherTest::FileExists(SettingDBPath()));
 }
 
 // Another process writes one column while the read-change-write is between

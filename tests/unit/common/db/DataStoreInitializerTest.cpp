@@ -1,12 +1,12 @@
 #include "DataStoreInitializer.h"
 #include "Setting.h"
-#include "SettingsTestSupport.h"
+#include "DBTestSupport.h"
 #include "WeatherDefine.h"
 
 #include <cstdlib>
 
 using namespace NSWeather;
-using SettingsTest::RawDB;
+using WeatherTest::RawDB;
 
 namespace
 {
@@ -22,9 +22,6 @@ constexpr const char* SETTING_FORMAT =
     "LastUpdateLanguageCode TEXT, CpType TEXT, DaemonType TEXT, IsNowRefreshing INT, IsSupportManualRefresh "
     "INT, "
     "RefreshingStartTime INT64);";
-constexpr const char* SHARE_TARGET_FORMAT =
-    "CREATE TABLE IF NOT EXISTS %s (PK_ID\tINTEGER NOT NULL PRIMARY KEY AUTOINCREMENT,AppID\tTEXT, "
-    "PortID\tTEXT);";
 constexpr const char* VERSION_FORMAT = "CREATE TABLE IF NOT EXISTS %s (dbVersion DOUBLE);";
 
 // User tables of a database file, without SQLite's own.
@@ -35,7 +32,7 @@ std::vector<std::string> TableNames(RawDB& db)
         "ORDER BY name");
 }
 
-class DataStoreInitializerTest : public SettingsTest::SettingsFixture
+class DataStoreInitializerTest : public WeatherTest::StoreTest
 {
 };
 
@@ -45,23 +42,21 @@ TEST_F(DataStoreInitializerTest, FreshRootGetsFourDatabasesWithTheirTablesAndDef
 
     RawDB weather(WeatherDBPath(), true);
     ASSERT_TRUE(weather.GetIsOpen());
-    EXPECT_EQ(6u, TableNames(weather).size());
-    for (const auto& table : SettingsTest::WEATHER_TABLE_FORMATS)
-        EXPECT_EQ(SettingsTest::StoredCreateSql(table.second, table.first), weather.TableSql(table.first));
+    // Their exact texts are pinned by the table statement tests.
+    EXPECT_EQ((std::vector<std::string>{"CITY_TABLE", "CURRENT_WEATHER_TABLE", "EXTRA_WEATHER_TABLE",
+                                        "HOURLY_WEATHER_TABLE", "MOON_PHASE_TABLE", "WEEKLY_WEATHER_TABLE"}),
+              TableNames(weather));
 
     RawDB setting(SettingDBPath(), true);
     EXPECT_EQ(std::vector<std::string>{"SETTING_TABLE"}, TableNames(setting));
-    EXPECT_EQ(SettingsTest::StoredCreateSql(SETTING_FORMAT, "SETTING_TABLE"),
+    EXPECT_EQ(WeatherTest::StoredCreateSql(SETTING_FORMAT, "SETTING_TABLE"),
               setting.TableSql("SETTING_TABLE"));
 
-    RawDB shareTarget(ShareTargetDBPath(), true);
-    EXPECT_EQ(SettingsTest::StoredCreateSql(SHARE_TARGET_FORMAT, "SHARE_TARGET_TABLE"),
-              shareTarget.TableSql("SHARE_TARGET_TABLE"));
-    EXPECT_EQ(0, shareTarget.QueryInt("SELECT COUNT(*) FROM SHARE_TARGET_TABLE"));
+    EXPECT_EQ(0, RawDB(ShareTargetDBPath(), true).QueryInt("SELECT COUNT(*) FROM SHARE_TARGET_TABLE"));
 
     RawDB version(VersionDBPath(), true);
     EXPECT_EQ(std::vector<std::string>{"VERSION_TABLE"}, TableNames(version));
-    EXPECT_EQ(SettingsTest::StoredCreateSql(VERSION_FORMAT, "VERSION_TABLE"),
+    EXPECT_EQ(WeatherTest::StoredCreateSql(VERSION_FORMAT, "VERSION_TABLE"),
               version.TableSql("VERSION_TABLE"));
 
     EXPECT_EQ("1|Accuweather|RI_DAEMON|6|1|en",
@@ -95,7 +90,7 @@ TEST_F(DataStoreInitializerTest, UnknownSharedFolderFailsWithoutCrash)
     std::string sharedData = mRoot.SharedDataDir();
     ASSERT_EQ(0, system(("rm -r '" + mRoot.Path("apps/com.quorvex.weather-m") + "'").c_str()));
     EXPECT_EQ(ERR_FAIL, DataStoreInitializer::Run());
-    EXPECT_FALSE(SettingsTest::FileExists(sharedData));
+    EXPECT_FALSE(WeatherTest::FileExists(sharedData));
     EXPECT_TRUE(mLog.Contains("(directoryPath.length() < 1) [return]")) << mLog.Dump();
 }
 

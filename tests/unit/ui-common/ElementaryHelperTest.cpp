@@ -5,7 +5,6 @@
 
 #include <app_common.h>
 
-#include <fstream>
 #include <string>
 
 #include "TestPlatform.h"
@@ -45,21 +44,12 @@ protected:
     Evas_Object* mWin = nullptr;
 };
 
-TEST_F(ElementaryHelperTest, MultiResPathResolvesThroughTheResourceManager)
+TEST_F(ElementaryHelperTest, ResourceNamesResolveInsideTheResourceFolderOnly)
 {
     EXPECT_EQ(mHelper.CreateMultiResPath("widget/TestLayouts.edj"), mResDir + "widget/TestLayouts.edj");
-    EXPECT_TRUE(mLog.Contains("[CreateMultiResPath] input : edje/widget/TestLayouts.edj, edj path : " +
-                              mResDir + "widget/TestLayouts.edj, ret = 0"))
-        << mLog.Dump();
-}
-
-TEST_F(ElementaryHelperTest, UnresolvableNameGivesNothingAnywhere)
-{
     EXPECT_EQ(mHelper.CreateMultiResPath("widget/Missing.edj"), "");
-    EXPECT_TRUE(mLog.Contains("(ret != 0 || edjPath == NULL) [return]", "weather-ui-common")) << mLog.Dump();
     EXPECT_EQ(mHelper.CreateMultiLayout(mWin, "widget/Missing.edj", "test/layout"), nullptr);
     EXPECT_EQ(mHelper.CreateMultiImage(mWin, "widget/Missing.edj", "test/image.png"), nullptr);
-    EXPECT_EQ(mLog.Count("(str.length() < 1) [return]"), 2);
     // An id that climbs out of the resource folder is no resource either.
     EXPECT_EQ(mHelper.CreateMultiResPath("../../com.quorvex.weather-m/shared/data/x"), "");
 }
@@ -77,12 +67,10 @@ TEST_F(ElementaryHelperTest, LayoutsLoadTheirGroupOrAreDeleted)
     EXPECT_EQ(CountTopLevelObjects(evas), before) << "the half-made layout was left behind";
     EXPECT_TRUE(mLog.Contains("elm_layout_file_set is failed. file: " + mResDir +
                               "widget/TestLayouts.edj, group: no/such/group"));
-    EXPECT_TRUE(mLog.Contains("(retEvas == NULL) [return]"));
 
     // Without file or group the layout stays bare.
     EXPECT_NE(mHelper.CreateLayout(mWin, "", ""), nullptr);
     EXPECT_EQ(mHelper.CreateLayout(nullptr, mResDir + "widget/TestLayouts.edj", "test/layout"), nullptr);
-    EXPECT_TRUE(mLog.Contains("(parent == NULL) [return]"));
 }
 
 TEST_F(ElementaryHelperTest, ImagesShowAGroupOfTheResourceFile)
@@ -96,28 +84,17 @@ TEST_F(ElementaryHelperTest, ImagesShowAGroupOfTheResourceFile)
     EXPECT_STREQ(group, "test/image.png");
 
     EXPECT_EQ(mHelper.CreateImage(nullptr, mResDir + "widget/TestLayouts.edj", "test/image.png"), nullptr);
-    EXPECT_TRUE(mLog.Contains("(parent == NULL) [return]"));
 }
 
-TEST_F(ElementaryHelperTest, ActivityIndicatorPulsesShownAndFillsWidth)
+TEST_F(ElementaryHelperTest, ActivityIndicatorPulsesShownInItsStyle)
 {
     Evas_Object* indicator = mHelper.CreateActivityIndicator(mWin, "wheel");
     ASSERT_NE(indicator, nullptr);
     EXPECT_TRUE(evas_object_visible_get(indicator));
     EXPECT_TRUE(elm_progressbar_pulse_get(indicator));
-    double x = 0, y = 0;
-    evas_object_size_hint_align_get(indicator, &x, &y);
-    EXPECT_DOUBLE_EQ(x, EVAS_HINT_FILL);
-    EXPECT_DOUBLE_EQ(y, 0.5);
-    evas_object_size_hint_weight_get(indicator, &x, &y);
-    EXPECT_DOUBLE_EQ(x, 1.0);
-    EXPECT_DOUBLE_EQ(y, 1.0);
     EXPECT_STREQ(elm_object_style_get(indicator), "wheel");
-
     EXPECT_EQ(mHelper.CreateActivityIndicator(nullptr, "wheel"), nullptr);
-    EXPECT_TRUE(mLog.Contains("(parent == NULL) [return]"));
     EXPECT_EQ(mHelper.CreateActivityIndicator(mWin, ""), nullptr);
-    EXPECT_TRUE(mLog.Contains("(style.length() <= 0) [return]"));
 }
 
 }  // namespace

@@ -107,21 +107,8 @@ TEST_F(ChangeableThemeTest, ChangeAfterFailedFontLoadReappliesColourAndStyleOnly
     EXPECT_TRUE(mLog.Contains("(pThis == NULL) [return]", "weather-ui-common"));
 }
 
-TEST_F(ChangeableThemeTest, UnknownSharedResourceFolderGivesEmptyPaths)
-{
-    ASSERT_EQ(system(("rm -rf '" + mRoot.Path("apps/com.quorvex.weather-m") + "'").c_str()), 0);
-    EXPECT_EQ(ChangeableTheme::GetColorTablePath(), "");
-    EXPECT_EQ(ChangeableTheme::GetFontTablePath(), "");
-    EXPECT_EQ(mLog.Count("(ret.length() < 1) [return]", "weather-ui-common"), 2) << mLog.Dump();
-
-    ChangeableTheme theme;
-    EXPECT_EQ(theme.LoadColorTable(), nullptr);
-    EXPECT_TRUE(mLog.Contains("(colorTablePath.length() < 1) [return]"));
-    EXPECT_EQ(theme.LoadFontTable(), nullptr);
-    EXPECT_TRUE(mLog.Contains("(fontTablePath.length() < 1) [return]"));
-}
-
-TEST_F(ChangeableThemeTest, UnloadingTwiceOnlyLogsTheSecondTime)
+// Unload deletes the table; a second unload or deinit finds nothing to free.
+TEST_F(ChangeableThemeTest, UnloadDeletesTheTablesOnce)
 {
     WriteColorTable();
     WriteFontTable();
@@ -130,47 +117,27 @@ TEST_F(ChangeableThemeTest, UnloadingTwiceOnlyLogsTheSecondTime)
     uxt_theme_color_table_h colors = theme.GetColorTable();
     theme.UnloadColorTable();
     EXPECT_EQ(uxt_theme_set_color_table(colors), UXT_THEME_ERROR_INVALID_PARAMETER) << "not deleted";
-    EXPECT_EQ(mLog.Count("(mColorTable == NULL) [return]"), 0);
     theme.UnloadColorTable();
-    EXPECT_EQ(mLog.Count("(mColorTable == NULL) [return]"), 1);
-
     theme.DeinitChangeableTheme();
     theme.DeinitChangeableTheme();
-    EXPECT_EQ(mLog.Count("(mColorTable == NULL) [return]"), 3);
-    EXPECT_EQ(mLog.Count("(mFontTable == NULL) [return]"), 1);
+    EXPECT_EQ(theme.GetFontTable(), nullptr);
 }
 
-TEST_F(ChangeableThemeTest, ThemeChangeAfterDeinitOrDestructionReachesNothing)
-{
-    WriteColorTable();
-    WriteFontTable();
-    ChangeableTheme theme;
-    ASSERT_EQ(theme.InitChangeableTheme(), 0);
-    theme.DeinitChangeableTheme();
-    ASSERT_EQ(uxt_theme_set_style(UXT_THEME_STYLE_DARK), UXT_THEME_ERROR_NONE);
-    ChangeThemeKeyAndWait(2);
-    EXPECT_EQ(CurrentStyle(), UXT_THEME_STYLE_DARK);
-
-    auto dropped = std::make_unique<ChangeableTheme>();
-    ASSERT_EQ(dropped->InitChangeableTheme(), 0);
-    dropped.reset();
-    ChangeThemeKeyAndWait(1);
-    EXPECT_EQ(CurrentStyle(), UXT_THEME_STYLE_DARK);
-}
-
-TEST_F(ChangeableThemeTest, EveryLiveThemeFollowsUntilItsOwnDeinit)
+// A change reaches every live theme, and none that was deinitialised or
+// destroyed (ASan sees a callback into a freed one).
+TEST_F(ChangeableThemeTest, OnlyLiveThemesFollowKeyChanges)
 {
     WriteColorTable();
     WriteFontTable();
     ChangeableTheme first;
-    ChangeableTheme second;
+    auto second = std::make_unique<ChangeableTheme>();
     ASSERT_EQ(first.InitChangeableTheme(), 0);
-    ASSERT_EQ(second.InitChangeableTheme(), 0);
+    ASSERT_EQ(second->InitChangeableTheme(), 0);
     first.DeinitChangeableTheme();
     ChangeThemeKeyAndWait(2);
     EXPECT_EQ(GetClassColor("AO803E1"), THEME2_ACCENT) << "the remaining view lost its registration";
 
-    second.DeinitChangeableTheme();
+    second.reset();
     ASSERT_EQ(uxt_theme_set_style(UXT_THEME_STYLE_DARK), UXT_THEME_ERROR_NONE);
     ChangeThemeKeyAndWait(1);
     EXPECT_EQ(CurrentStyle(), UXT_THEME_STYLE_DARK);

@@ -6,13 +6,13 @@
 #include <unistd.h>
 
 #include "DataStoreInitializer.h"
-#include "SettingsTestSupport.h"
+#include "DBTestSupport.h"
 #include "UpgradeDBController.h"
 #include "VersionDBController.h"
 #include "WeatherDefine.h"
 
 using namespace NSWeather;
-using SettingsTest::RawDB;
+using WeatherTest::RawDB;
 
 namespace
 {
@@ -47,7 +47,7 @@ std::set<std::string> LowerCase(const std::vector<std::string>& names)
     return lower;
 }
 
-class UpgradeFixture : public SettingsTest::SettingsFixture
+class UpgradeFixture : public WeatherTest::StoreTest
 {
 protected:
     // A weather database as an installation of `version` left it: two
@@ -57,8 +57,8 @@ protected:
     {
         MakeDBDir();
         RawDB db(WeatherDBPath());
-        for (const auto& table : SettingsTest::WEATHER_TABLE_FORMATS)
-            db.Exec(SettingsTest::OldWeatherTableSql(table.first, version));
+        for (const auto& table : WeatherTest::WEATHER_TABLE_FORMATS)
+            db.Exec(WeatherTest::OldWeatherTableSql(table.first, version));
         if (version < 0.2)
             db.Exec("CREATE TABLE VERSION_TABLE (dbVersion DOUBLE); INSERT INTO VERSION_TABLE VALUES (0.1);");
         db.Exec(
@@ -102,9 +102,9 @@ protected:
     void ExpectCompleteColumns()
     {
         RawDB db(WeatherDBPath(), true);
-        for (const auto& table : SettingsTest::WEATHER_TABLE_FORMATS)
+        for (const auto& table : WeatherTest::WEATHER_TABLE_FORMATS)
         {
-            std::string complete = SettingsTest::OldWeatherTableSql(table.first, 0.8);
+            std::string complete = WeatherTest::OldWeatherTableSql(table.first, 0.8);
             RawDB scratch(":memory:");
             scratch.Exec(complete);
             EXPECT_EQ(LowerCase(scratch.ColumnNames(table.first)), LowerCase(db.ColumnNames(table.first)))

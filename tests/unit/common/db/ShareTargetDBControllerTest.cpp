@@ -1,14 +1,14 @@
-#include "SettingsTestSupport.h"
+#include "DBTestSupport.h"
 #include "ShareTargetDBController.h"
 #include "WeatherDefine.h"
 
 using namespace NSWeather;
-using SettingsTest::RawDB;
+using WeatherTest::RawDB;
 
 namespace
 {
 
-class ShareTargetDBControllerTest : public SettingsTest::SettingsFixture
+class ShareTargetDBControllerTest : public WeatherTest::StoreTest
 {
 protected:
     void SetUp() override

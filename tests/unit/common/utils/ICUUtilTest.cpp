@@ -51,8 +51,10 @@ TEST_F(ICUUtilTest, TwelveAndTwentyFourHourClocks)
 
 TEST_F(ICUUtilTest, MonthAndDayHasFixedPatternsForKoreanAndLao)
 {
-    const std::pair<const char*, const char*> kCases[] = {
-        {"ko_KR.UTF-8", "07/14"}, {"lo_LA.UTF-8", "14/07"}, {"en_US.UTF-8", "07/14"}, {"de_DE.UTF-8", "14.07."}};
+    const std::pair<const char*, const char*> kCases[] = {{"ko_KR.UTF-8", "07/14"},
+                                                          {"lo_LA.UTF-8", "14/07"},
+                                                          {"en_US.UTF-8", "07/14"},
+                                                          {"de_DE.UTF-8", "14.07."}};
     for (const auto& item : kCases)
     {
         mLcTime.Set(item.first);
