@@ -23,8 +23,6 @@ namespace NSWeather
 namespace
 {
 const std::string CURRENT_LOCATION_SUFFIX = ":C";
-constexpr int WRITE_ATTEMPTS = 5;
-constexpr useconds_t RETRY_WAIT_USEC = 50000;
 
 std::string CatalogueIdOf(const std::string& locationId)
 {
@@ -121,20 +119,10 @@ bool WeatherAgent::RefreshCity(const CityPtr& storedPtr, int contentProvider, ti
     KeepIdentity(*storedPtr, *freshPtr);
     freshPtr->SetRefreshedTime(now);
     DBController dbController;
-    bool isWritten = false;
-    // A write that meets another process's write is rolled back whole; the
-    // next attempt starts from a clean state.
-    for (int attempt = 0; !isWritten && attempt < WRITE_ATTEMPTS; ++attempt)
-    {
-        if (attempt > 0)
-            usleep(RETRY_WAIT_USEC * attempt);
-        // The row is found again by its location id inside the write, so a
-        // city moved or removed meanwhile by another process is never
-        // overwritten.
-        freshPtr->SetPageIndex(-1);
-        isWritten = dbController.UpdateCityData(freshPtr) == ERR_OK;
-    }
-    if (!isWritten)
+    // The row is found again by its location id inside the write, so a city
+    // moved or removed meanwhile by another process is never overwritten.
+    freshPtr->SetPageIndex(-1);
+    if (dbController.UpdateCityData(freshPtr) != ERR_OK)
     {
         SIBLING_LOG("city '%s' could not be written", freshPtr->GetLocationId().c_str());
         return false;

@@ -20,8 +20,6 @@ namespace NSWeather
 namespace
 {
 constexpr size_t PREFIX_CANDIDATES = 20;
-constexpr int WRITE_ATTEMPTS = 5;
-constexpr useconds_t RETRY_WAIT_USEC = 50000;
 const int INTERVAL_CHOICES[] = {0, 1, 3, 6, 12, 24};
 const char* const PROVIDER_TEXTS[] = {"Accuweather", "cmaweather", "Kweather", "weathernews_kr",
                                       "WeatherNews"};
@@ -172,27 +170,12 @@ bool WeatherAppCommands::KeepCurrentCityValid()
         ignored);
 }
 
-bool WeatherAppCommands::DeleteKeepingOrder(const std::string& locationId)
+bool WeatherAppCommands::Delete(const std::string& locationId)
 {
     DBController dbController;
-    CityPtrVectorPtr beforePtrVector = dbController.SelectAllCityData();
-    SIBLING_RETV_IF(!beforePtrVector, false);
     SIBLING_RETV_IF(dbController.DeleteCityData(locationId) != ERR_OK, false);
     if (dbController.DeleteUselessMoonPhaseData() != ERR_OK)
         SIBLING_LOG("moon rows could not be removed");
-    // The store numbers the remaining pages in the order the cities were
-    // added; the user's order is put back.
-    auto orderPtrVector = std::make_shared<CityPtrVector>();
-    for (const CityPtr& cityPtr : *beforePtrVector)
-    {
-        if (cityPtr->GetLocationId() == locationId)
-            continue;
-        cityPtr->SetPageIndex(dbController.GetPageIndexWithLocationID(cityPtr->GetLocationId()));
-        if (cityPtr->GetPageIndex() >= 0)
-            orderPtrVector->push_back(cityPtr);
-    }
-    if (dbController.ReorderCityData(orderPtrVector) != ERR_OK)
-        SIBLING_LOG("the page order could not be restored");
     return true;
 }
 
@@ -210,18 +193,8 @@ int WeatherAppCommands::Add(const std::string& query, std::string& out)
     CityPtr cityPtr = mAgent.MakeCity(*placePtr, false, ContentProvider::GetContentProvider());
     if (!cityPtr)
         return Fail(out, "no weather for " + placePtr->GetId());
-    // A write that meets another process's write is rolled back whole and
-    // tried again.
-    bool isStored = false;
-    for (int attempt = 0; !isStored && attempt < WRITE_ATTEMPTS; ++attempt)
-    {
-        if (attempt > 0)
-            usleep(RETRY_WAIT_USEC * attempt);
-        cityPtr->SetPageIndex(-1);
-        isStored =
-            dbController.InsertCityData(cityPtr) == ERR_OK || dbController.SelectCityData(placePtr->GetId());
-    }
-    if (!isStored)
+    cityPtr->SetPageIndex(-1);
+    if (dbController.InsertCityData(cityPtr) != ERR_OK)
         return Fail(out, placePtr->GetId() + " could not be stored");
     cityPtr->SetPageIndex(-1);
     if (dbController.UpdateOnlyMoonPhaseData(cityPtr) != ERR_OK)
@@ -237,7 +210,7 @@ int WeatherAppCommands::Remove(const std::string& which, std::string& out)
     CityPtr cityPtr = FindStored(which);
     if (!cityPtr)
         return Fail(out, "no stored city '" + which + "'");
-    if (!DeleteKeepingOrder(cityPtr->GetLocationId()))
+    if (!Delete(cityPtr->GetLocationId()))
         return Fail(out, cityPtr->GetLocationId() + " could not be removed");
     KeepCurrentCityValid();
     out += "removed " + cityPtr->GetLocationId() + "\n";
@@ -368,7 +341,7 @@ int WeatherAppCommands::SetLocation(const std::string& onOff, std::string& out)
     // Without the current location its city goes too.
     if (!isOn && !currentLocationId.empty())
     {
-        if (!DeleteKeepingOrder(currentLocationId))
+        if (!Delete(currentLocationId))
             return Fail(out, currentLocationId + " could not be removed");
         KeepCurrentCityValid();
     }

@@ -44,8 +44,8 @@ private:
     static CityPtr FindStored(const std::string& which);
     // Points the settings' current city at a stored one when it names none.
     static bool KeepCurrentCityValid();
-    // Removes a city with its rows and keeps the order of the others.
-    static bool DeleteKeepingOrder(const std::string& locationId);
+    // Removes a city with its rows and its unused moon rows.
+    static bool Delete(const std::string& locationId);
     static bool ChangeSetting(const std::function<void(const SettingPtr&)>& change, std::string& out);
 
     CityCataloguePtr mCataloguePtr;

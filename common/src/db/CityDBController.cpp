@@ -254,10 +254,13 @@ bool CityDBController::IsCurrentLocationExist()
 
 bool CityDBController::SetPageIndexAsAscending()
 {
-    // Keys are collected first so no update runs under an open cursor.
+    // The pages close up in their current order: ordered by key, a delete
+    // would put back the order in which the cities were added, undoing the
+    // user's moves. Keys are collected first so no update runs under an open
+    // cursor.
     std::vector<int> keys;
     {
-        DBStatement select(std::string("SELECT PK_ID FROM ") + TABLE_NAME + " ORDER BY PK_ID ASC;");
+        DBStatement select(std::string("SELECT PK_ID FROM ") + TABLE_NAME + " ORDER BY pageIndex ASC, PK_ID ASC;");
         while (select.Step() == SQLITE_ROW) keys.push_back(select.ColumnInt(0));
     }
     DBStatement update(std::string("UPDATE ") + TABLE_NAME + " SET pageIndex=? WHERE PK_ID=?;");

@@ -22,7 +22,7 @@ DBConnector* DBConnector::GetInstance()
     return instance;
 }
 
-DBConnector::DBConnector() : mDBHandle(nullptr), mIsCycleFailed(false), mIsImmediate(false) {}
+DBConnector::DBConnector() : mDBHandle(nullptr), mIsCycleFailed(false), mIsReadOnly(true) {}
 
 DBConnector::~DBConnector()
 {
@@ -31,14 +31,8 @@ DBConnector::~DBConnector()
 
 bool DBConnector::DBInitialize(const std::string& dbFilePath, bool isReadOnly)
 {
-    mIsImmediate = false;
+    mIsReadOnly = isReadOnly;
     return DBOpen(dbFilePath, isReadOnly);
-}
-
-bool DBConnector::DBInitializeImmediate(const std::string& dbFilePath)
-{
-    mIsImmediate = true;
-    return DBOpen(dbFilePath, false);
 }
 
 bool DBConnector::DBOpen(const std::string& dbFilePath, bool isReadOnly)
@@ -176,11 +170,13 @@ bool DBConnector::DBExcutePerformanceOptimization()
     return true;
 }
 
-// The immediate form takes the write lock at once (waiting through the busy
-// handler) instead of at the first write.
+// A read-write cycle takes the write lock at once, waiting through the busy
+// handler. Deferred, it would take the lock at its first write, and SQLite
+// refuses that upgrade at once, without the busy handler, while another
+// process writes: two writers at the same moment would lose a write.
 bool DBConnector::DBStartTransaction()
 {
-    const char* beginQuery = mIsImmediate ? "BEGIN IMMEDIATE TRANSACTION;" : "BEGIN TRANSACTION;";
+    const char* beginQuery = mIsReadOnly ? "BEGIN TRANSACTION;" : "BEGIN IMMEDIATE TRANSACTION;";
     int rc = sqlite3_exec(mDBHandle, beginQuery, nullptr, nullptr, nullptr);
     if (rc != SQLITE_OK)
     {

@@ -16,8 +16,6 @@ bool Open(DBConnector* dbConnector, const std::string& dbFilePath, DBCycleCloser
             return dbConnector->DBInitialize(dbFilePath, true);
         case DBCycleCloser::Mode::WRITE:
             return dbConnector->DBInitialize(dbFilePath, false);
-        case DBCycleCloser::Mode::WRITE_IMMEDIATE:
-            return dbConnector->DBInitializeImmediate(dbFilePath);
     }
     return false;
 }

@@ -124,7 +124,7 @@ SettingPtr SettingDBController::Select()
 SettingPtr SettingDBController::SelectAndUpdate(const std::function<void(const SettingPtr&)>& change)
 {
     COMMON_RETV_IF(!change, nullptr);
-    DBCycleCloser cycle(GetSettingDBFilePath(), DBCycleCloser::Mode::WRITE_IMMEDIATE);
+    DBCycleCloser cycle(GetSettingDBFilePath(), DBCycleCloser::Mode::WRITE);
     COMMON_RETV_IF(cycle.GetIsOpened() == false, nullptr);
     SettingPtr settingPtr = SelectRow();
     COMMON_RETV_IF(!settingPtr, nullptr);

@@ -19,10 +19,9 @@ public:
     static DBConnector* GetInstance();
     virtual ~DBConnector();
 
-    bool DBInitialize(const std::string& dbFilePath, bool isReadOnly);
-    // A write cycle that holds the write lock from its first read on, so no
+    // A read-write cycle holds the write lock from its first read on, so no
     // other process writes between what it reads and what it writes back.
-    bool DBInitializeImmediate(const std::string& dbFilePath);
+    bool DBInitialize(const std::string& dbFilePath, bool isReadOnly);
     // Commits (or rolls back a failed cycle) and closes; true only when a
     // cycle without failure was committed.
     bool DBFinalize();
@@ -55,7 +54,7 @@ private:
 
     sqlite3* mDBHandle;
     bool mIsCycleFailed;
-    bool mIsImmediate;
+    bool mIsReadOnly;
 };
 
 }  // namespace NSWeather

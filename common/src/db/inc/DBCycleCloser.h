@@ -18,9 +18,8 @@ public:
     enum class Mode
     {
         READ,
-        WRITE,
         // Takes the write lock before the first read (see DBConnector).
-        WRITE_IMMEDIATE,
+        WRITE,
     };
 
     DBCycleCloser(const std::string& dbFilePath, Mode mode);

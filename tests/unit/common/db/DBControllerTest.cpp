@@ -160,7 +160,7 @@ TEST_F(DBControllerTest, ShorterWeeklyListLeavesSurplusRows)
     EXPECT_EQ(days->at(7)->GetWeatherStatus(), "day 7");
 }
 
-TEST_F(DBControllerTest, DeleteRenumbersInInsertionOrder)
+TEST_F(DBControllerTest, DeleteKeepsTheUsersPageOrder)
 {
     InsertCities({"A", "B", "C"});
     CityPtrVectorPtr cities = mDB.SelectAllCityData();
@@ -170,14 +170,14 @@ TEST_F(DBControllerTest, DeleteRenumbersInInsertionOrder)
     EXPECT_EQ(PageOrder(), (std::vector<std::string>{"C@0", "A@1", "B@2"}));
 
     ASSERT_EQ(mDB.DeleteCityData(std::string("A")), ERR_OK);
-    EXPECT_EQ(PageOrder(), (std::vector<std::string>{"B@0", "C@1"}));
+    EXPECT_EQ(PageOrder(), (std::vector<std::string>{"C@0", "B@1"}));
     RawDB raw(WeatherDBPath());
     EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE;"), 48);
     EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM CURRENT_WEATHER_TABLE;"), 2);
     EXPECT_EQ(raw.QueryInt("SELECT COUNT(*) FROM EXTRA_WEATHER_TABLE;"), 2);
 
     ASSERT_EQ(mDB.DeleteCityData(1), ERR_OK);
-    EXPECT_EQ(PageOrder(), (std::vector<std::string>{"B@0"}));
+    EXPECT_EQ(PageOrder(), (std::vector<std::string>{"C@0"}));
     EXPECT_EQ(mDB.ReorderCityData(nullptr), ERR_FAIL);
     EXPECT_TRUE(mLog.Contains("(!reorderPtrVector) [return]"));
 }
