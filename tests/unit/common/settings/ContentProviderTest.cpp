@@ -61,4 +61,25 @@ TEST_F(ContentProviderTest, MissingSettingRowFallsBackToAccuWeather)
     EXPECT_TRUE(mLog.Contains("(!settingPtr) [return]")) << mLog.Dump();
 }
 
+// Inside a rebuild the provider is read once; a change by another process
+// shows once the outermost scope has ended, and at once outside any scope.
+TEST_F(ContentProviderTest, RebuildScopeReadsTheProviderOnce)
+{
+    SetCpType("Kweather");
+    {
+        ContentProvider::RebuildScope outer;
+        EXPECT_EQ(CP_KWEATHER, ContentProvider::GetContentProvider());
+        SetCpType("WeatherNews");
+        {
+            ContentProvider::RebuildScope inner;
+            EXPECT_EQ(CP_KWEATHER, ContentProvider::GetContentProvider());
+        }
+        EXPECT_EQ(CP_KWEATHER, ContentProvider::GetContentProvider());
+    }
+    EXPECT_EQ(CP_WEATHERNEWS, ContentProvider::GetContentProvider());
+    ContentProvider::RebuildScope next;
+    SetCpType("cmaweather");
+    EXPECT_EQ(CP_CMAWEATHER, ContentProvider::GetContentProvider());
+}
+
 }  // namespace
