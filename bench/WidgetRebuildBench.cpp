@@ -11,6 +11,7 @@
 #include <string>
 #include <vector>
 
+#include "ContentProvider.h"
 #include "DataStoreInitializer.h"
 #include "FileUtil.h"
 #include "SampleCities.h"
@@ -79,6 +80,8 @@ void Rebuild(benchmark::State& state, int h)
     }
     for (auto _ : state)
     {
+        // As the update callback does: the provider is read once per rebuild.
+        NSWeather::ContentProvider::RebuildScope providerReadOnce;
         widgetMain->LoadAllWeatherInformation();
         for (int i = 0; i < 3; ++i) pages[i]->Resume(i);
         canvas.Render();

@@ -18,10 +18,22 @@ enum ContentProviderType
 
 // Which provider the suite fetches from, and its logo. Reads the setting
 // database on every call, so a provider switched by the weather
-// application shows at once.
+// application shows at once; only inside a RebuildScope is it read once.
 class ContentProvider
 {
 public:
+    // One rebuild asks for the provider dozens of times; while an object
+    // of this class lives, the first successful read answers them all.
+    // Scopes nest; the answer is forgotten when the outermost one ends.
+    class RebuildScope
+    {
+    public:
+        RebuildScope();
+        ~RebuildScope();
+        RebuildScope(const RebuildScope&) = delete;
+        RebuildScope& operator=(const RebuildScope&) = delete;
+    };
+
     virtual ~ContentProvider() = default;
 
     // A ContentProviderType; CP_ACCUWEATHER for an unknown text or when

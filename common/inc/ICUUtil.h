@@ -38,10 +38,14 @@ public:
     static std::string MakeTimeZoneId(int offsetSeconds);
     // The skeleton at `index`, or empty outside the table.
     static std::string GetSkeleton(int index);
+    // Drops the cached patterns and formatters. Nothing needs it for
+    // correctness (the caches are keyed on locale and zone); it frees them.
+    static void ClearCache();
 
 private:
     static std::u16string GetPattern(const std::string& locale, int index);
     static std::u16string GetBestPattern(const std::string& locale, const std::string& skeleton);
+    static std::u16string MakeBestPattern(const std::string& locale, const std::string& skeleton);
     static std::string Format(time_t t, const std::string& locale, const std::string& zoneId,
                               const std::u16string& pattern);
 };

@@ -7,12 +7,35 @@
 namespace NSWeather
 {
 
+namespace
+{
+int gScopeDepth = 0;
+// -1: nothing read in the current scope.
+int gScopedProvider = -1;
+}  // namespace
+
+ContentProvider::RebuildScope::RebuildScope()
+{
+    ++gScopeDepth;
+}
+
+ContentProvider::RebuildScope::~RebuildScope()
+{
+    if (--gScopeDepth == 0)
+        gScopedProvider = -1;
+}
+
 int ContentProvider::GetContentProvider()
 {
+    if (gScopeDepth > 0 && gScopedProvider >= 0)
+        return gScopedProvider;
     SettingDBController settingDBController;
     SettingPtr settingPtr = settingDBController.Select();
     COMMON_RETV_IF(!settingPtr, CP_ACCUWEATHER);
-    return GetContentProviderOfCpType(settingPtr->GetCpType());
+    int provider = GetContentProviderOfCpType(settingPtr->GetCpType());
+    if (gScopeDepth > 0)
+        gScopedProvider = provider;
+    return provider;
 }
 
 int ContentProvider::GetContentProviderOfCpType(const std::string& cpType)

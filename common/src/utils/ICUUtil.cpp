@@ -4,6 +4,10 @@
 
 #include <cstdlib>
 #include <cstring>
+#include <map>
+#include <memory>
+#include <tuple>
+#include <type_traits>
 
 #include "CommonLog.h"
 
@@ -18,10 +22,10 @@ const int32_t kBufferUnits = 64;
 const int32_t kUtf8Bytes = kBufferUnits * 3 + 1;
 
 const char* const kSkeletons[ICUUtil::SKELETON_COUNT] = {
-    "dd",     "MMMdd",   "yyyyMMM",    "yyyyMMMdd", "ddMMMyyyy", "MMMMdyyyy",    "yyyyMMMMdd",
-    "yyyy",   "MMM",     "HHmm",       "hhmm",      "EEE",       "MM",           "MMMMEd",
-    "MMMEd",  "MMdd",    "yyyy/MM/dd", "a",         "h",         "HH",           "mm",
-    "d",      "EEEdMMM HHmm", "EEEdMMM hhmm", "MMMdd HHmm", "MMMdd hhmm"};
+    "dd",    "MMMdd",        "yyyyMMM",      "yyyyMMMdd",  "ddMMMyyyy", "MMMMdyyyy", "yyyyMMMMdd",
+    "yyyy",  "MMM",          "HHmm",         "hhmm",       "EEE",       "MM",        "MMMMEd",
+    "MMMEd", "MMdd",         "yyyy/MM/dd",   "a",          "h",         "HH",        "mm",
+    "d",     "EEEdMMM HHmm", "EEEdMMM hhmm", "MMMdd HHmm", "MMMdd hhmm"};
 
 std::u16string ToUtf16(const std::string& text)
 {
@@ -43,7 +47,28 @@ const i18n_uchar* AsUChars(const std::u16string& text)
 {
     return reinterpret_cast<const i18n_uchar*>(text.c_str());
 }
+
+struct FormatDestroy
+{
+    void operator()(i18n_udate_format_h format) const { i18n_udate_destroy(format); }
+};
+using FormatOwner = std::unique_ptr<std::remove_pointer<i18n_udate_format_h>::type, FormatDestroy>;
+
+// A pattern generator costs milliseconds; a rebuild asks for the same few
+// patterns and formats many times. Keyed on every value the result depends
+// on (locale, skeleton, zone), so a changed locale, zone or 12/24 setting
+// misses instead of serving a stale text.
+std::map<std::pair<std::string, std::string>, std::u16string> gPatternCache;
+std::map<std::tuple<std::string, std::string, std::u16string>, FormatOwner> gFormatCache;
+// Bounds both caches: locales and zones change rarely, but nothing stops them.
+const size_t kCacheEntries = 64;
 }  // namespace
+
+void ICUUtil::ClearCache()
+{
+    gPatternCache.clear();
+    gFormatCache.clear();
+}
 
 std::string ICUUtil::GetLocaleStr()
 {
@@ -74,7 +99,8 @@ std::string ICUUtil::MakeTimeZoneId(int offsetSeconds)
 {
     long magnitude = offsetSeconds < 0 ? -static_cast<long>(offsetSeconds) : offsetSeconds;
     long minutes = (magnitude % 3600) / 60;
-    std::string id = std::string("GMT") + (offsetSeconds < 0 ? "-" : "+") + std::to_string(magnitude / 3600) + ":";
+    std::string id =
+        std::string("GMT") + (offsetSeconds < 0 ? "-" : "+") + std::to_string(magnitude / 3600) + ":";
     if (minutes < 10)
         id += "0";
     return id + std::to_string(minutes);
@@ -112,6 +138,21 @@ std::u16string ICUUtil::GetPattern(const std::string& locale, int index)
 
 std::u16string ICUUtil::GetBestPattern(const std::string& locale, const std::string& skeleton)
 {
+    auto key = std::make_pair(locale, skeleton);
+    auto found = gPatternCache.find(key);
+    if (found != gPatternCache.end())
+        return found->second;
+    std::u16string pattern = MakeBestPattern(locale, skeleton);
+    if (pattern.empty())
+        return pattern;
+    if (gPatternCache.size() >= kCacheEntries)
+        gPatternCache.clear();
+    gPatternCache.emplace(key, pattern);
+    return pattern;
+}
+
+std::u16string ICUUtil::MakeBestPattern(const std::string& locale, const std::string& skeleton)
+{
     i18n_udatepg_h generator = nullptr;
     int ret = i18n_udatepg_create(locale.c_str(), &generator);
     if (ret != I18N_ERROR_NONE || !generator)
@@ -122,7 +163,8 @@ std::u16string ICUUtil::GetBestPattern(const std::string& locale, const std::str
     std::u16string skeletonText = ToUtf16(skeleton);
     i18n_uchar pattern[kBufferUnits + 1] = {0};
     int32_t length = 0;
-    ret = i18n_udatepg_get_best_pattern(generator, AsUChars(skeletonText), -1, pattern, kBufferUnits, &length);
+    ret =
+        i18n_udatepg_get_best_pattern(generator, AsUChars(skeletonText), -1, pattern, kBufferUnits, &length);
     i18n_udatepg_destroy(generator);
     if (ret != I18N_ERROR_NONE || length <= 0 || length > kBufferUnits)
     {
@@ -132,9 +174,15 @@ std::u16string ICUUtil::GetBestPattern(const std::string& locale, const std::str
     return std::u16string(reinterpret_cast<const char16_t*>(pattern), static_cast<size_t>(length));
 }
 
-std::string ICUUtil::Format(time_t t, const std::string& locale, const std::string& zoneId,
-                            const std::u16string& pattern)
+namespace
 {
+i18n_udate_format_h GetFormat(const std::string& locale, const std::string& zoneId,
+                              const std::u16string& pattern)
+{
+    auto key = std::make_tuple(locale, zoneId, pattern);
+    auto found = gFormatCache.find(key);
+    if (found != gFormatCache.end())
+        return found->second.get();
     std::u16string zone = ToUtf16(zoneId);
     i18n_udate_format_h format = nullptr;
     int ret = i18n_udate_create(I18N_UDATE_PATTERN, I18N_UDATE_PATTERN, locale.c_str(), AsUChars(zone), -1,
@@ -142,13 +190,25 @@ std::string ICUUtil::Format(time_t t, const std::string& locale, const std::stri
     if (ret != I18N_ERROR_NONE || !format)
     {
         COMMON_LOG("i18n_udate_create failed(%d)", ret);
-        return std::string();
+        return nullptr;
     }
+    if (gFormatCache.size() >= kCacheEntries)
+        gFormatCache.clear();
+    gFormatCache.emplace(key, FormatOwner(format));
+    return format;
+}
+}  // namespace
+
+std::string ICUUtil::Format(time_t t, const std::string& locale, const std::string& zoneId,
+                            const std::u16string& pattern)
+{
+    i18n_udate_format_h format = GetFormat(locale, zoneId, pattern);
+    if (!format)
+        return std::string();
     i18n_uchar result[kBufferUnits + 1] = {0};
     int32_t needed = 0;
-    ret = i18n_udate_format_date(format, static_cast<i18n_udate>(t) * 1000.0, result, kBufferUnits, nullptr,
-                                 &needed);
-    i18n_udate_destroy(format);
+    int ret = i18n_udate_format_date(format, static_cast<i18n_udate>(t) * 1000.0, result, kBufferUnits,
+                                     nullptr, &needed);
     if (ret != I18N_ERROR_NONE || needed > kBufferUnits)
     {
         COMMON_LOG("i18n_udate_format_date failed(%d)", ret);

@@ -7,6 +7,7 @@
 #include <widget_errno.h>
 #include <widget_service.h>
 
+#include "ContentProvider.h"
 #include "WidgetLog.h"
 #include "WidgetMain.h"
 #include "WidgetViewController.h"
@@ -39,6 +40,7 @@ int WidgetMain::CreateWidgetInstance(widget_context_h context, bundle*, int w, i
     WidgetMain* widgetMain = GetInstance();
     WIDGET_RETV_IF(!widgetMain, kErrorInvalid);
 
+    NSWeather::ContentProvider::RebuildScope providerReadOnce;
     widgetMain->LoadAllWeatherInformation();
     auto controller = std::make_shared<WidgetViewController>();
     controller->Initialize();
@@ -131,6 +133,7 @@ int WidgetMain::ResumeWidgetInstance(widget_context_h context, void*)
     WidgetMain* widgetMain = GetInstance();
     if (id.empty() || !widgetMain)
         return 0;
+    NSWeather::ContentProvider::RebuildScope providerReadOnce;
     widgetMain->LoadAllWeatherInformation();
     WidgetViewControllerPtr widgetViewControllerPtr = widgetMain->FindWidgetObject(id);
     WIDGET_RETV_IF(!widgetViewControllerPtr, 0);
@@ -149,6 +152,7 @@ int WidgetMain::UpdateWidgetInstance(widget_context_h context, bundle*, int, voi
         return WIDGET_ERROR_NOT_EXIST;
     WidgetMain* widgetMain = GetInstance();
     WIDGET_RETV_IF(!widgetMain, 0);
+    NSWeather::ContentProvider::RebuildScope providerReadOnce;
     widgetMain->LoadAllWeatherInformation();
     WidgetViewControllerPtr widgetViewControllerPtr = widgetMain->FindWidgetObject(id);
     if (!widgetViewControllerPtr)

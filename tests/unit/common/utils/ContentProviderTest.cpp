@@ -25,6 +25,10 @@ protected:
     {
         return WeatherTest::RawDB(mRoot.SharedDataDir() + "db/.setting.db");
     }
+    void SetCpType(const std::string& cpType)
+    {
+        SettingDB().Exec("UPDATE SETTING_TABLE SET CpType = '" + cpType + "'");
+    }
 };
 
 // The stored text is matched exactly; anything else is AccuWeather.
@@ -61,6 +65,27 @@ TEST_F(ContentProviderTest, MissingSettingRowFallsBackToAccuWeather)
     EXPECT_EQ(CP_ACCUWEATHER, ContentProvider::GetContentProvider());
     EXPECT_EQ("weather_logo_accuweather.png", ContentProvider::GetCPLogoIconPath(1));
     EXPECT_TRUE(mLog.Contains("(!settingPtr) [return]")) << mLog.Dump();
+}
+
+// Inside a rebuild the provider is read once; a change by another process
+// shows once the outermost scope has ended, and at once outside any scope.
+TEST_F(ContentProviderTest, RebuildScopeReadsTheProviderOnce)
+{
+    SetCpType("Kweather");
+    {
+        ContentProvider::RebuildScope outer;
+        EXPECT_EQ(CP_KWEATHER, ContentProvider::GetContentProvider());
+        SetCpType("WeatherNews");
+        {
+            ContentProvider::RebuildScope inner;
+            EXPECT_EQ(CP_KWEATHER, ContentProvider::GetContentProvider());
+        }
+        EXPECT_EQ(CP_KWEATHER, ContentProvider::GetContentProvider());
+    }
+    EXPECT_EQ(CP_WEATHERNEWS, ContentProvider::GetContentProvider());
+    ContentProvider::RebuildScope next;
+    SetCpType("cmaweather");
+    EXPECT_EQ(CP_CMAWEATHER, ContentProvider::GetContentProvider());
 }
 
 }  // namespace

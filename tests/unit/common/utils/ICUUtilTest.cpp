@@ -83,4 +83,39 @@ TEST_F(ICUUtilTest, IndexOutsideTheTableGivesEmptyText)
     EXPECT_EQ(ICUUtil::GetSkeleton(25), "MMMdd hhmm");
 }
 
+// The cached patterns and formatters never outlive the locale or zone
+// they were made for: each switch, back and forth, gives that setting's text.
+TEST_F(ICUUtilTest, CachedFormatsFollowLocaleAndZoneChanges)
+{
+    const struct
+    {
+        const char* lcTime;
+        const char* tz;
+        int skeleton;
+        const char* text;
+    } kSteps[] = {
+        {"en_US.UTF-8", "UTC", ICUUtil::SKELETON_hhmm,
+         "12:00\xE2\x80\xAF"
+         "AM"},
+        {"ko_KR.UTF-8", "UTC", ICUUtil::SKELETON_hhmm, "\xEC\x98\xA4\xEC\xA0\x84 12:00"},
+        {"ko_KR.UTF-8", "<+0530>-5:30", ICUUtil::SKELETON_hhmm, "\xEC\x98\xA4\xEC\xA0\x84 5:30"},
+        {"ko_KR.UTF-8", "<+0530>-5:30", ICUUtil::SKELETON_HHMM, "05:30"},
+        {"en_US.UTF-8", "UTC", ICUUtil::SKELETON_hhmm,
+         "12:00\xE2\x80\xAF"
+         "AM"},
+        {"de_DE.UTF-8", "UTC", ICUUtil::SKELETON_MMdd, "14.07."},
+    };
+    for (bool cleared : {false, true})
+    {
+        for (const auto& step : kSteps)
+        {
+            mLcTime.Set(step.lcTime);
+            mTz.Set(step.tz);
+            EXPECT_EQ(ICUUtil::GetDateTimeString(kJuly14, step.skeleton), step.text)
+                << step.lcTime << " " << step.tz << (cleared ? " after ClearCache" : "");
+        }
+        ICUUtil::ClearCache();
+    }
+}
+
 }  // namespace
