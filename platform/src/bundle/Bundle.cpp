@@ -3,9 +3,9 @@
 
 #include <cstdlib>
 #include <cstring>
-#include <new>
 
 #include "bundle/BundleInternal.h"
+#include "core/ApiGuard.h"
 #include "dlog.h"
 
 namespace
@@ -45,15 +45,13 @@ extern "C" int bundle_add_str(bundle* b, const char* key, const char* str)
         return Fail(BUNDLE_ERROR_INVALID_PARAMETER);
     if (platform::BundleFind(b, key))
         return Fail(BUNDLE_ERROR_KEY_EXISTS);
-    try
-    {
-        b->items.push_back(std::make_unique<keyval_t>(keyval_t{key, BUNDLE_TYPE_STR, str}));
-    }
-    catch (const std::bad_alloc&)
-    {
-        return Fail(BUNDLE_ERROR_OUT_OF_MEMORY);
-    }
-    return Fail(BUNDLE_ERROR_NONE);
+    return platform::GuardedCall(
+        "BUNDLE", BUNDLE_ERROR_OUT_OF_MEMORY,
+        [&]
+        {
+            b->items.push_back(std::make_unique<keyval_t>(keyval_t{key, BUNDLE_TYPE_STR, str}));
+            return Fail(BUNDLE_ERROR_NONE);
+        });
 }
 
 extern "C" int bundle_get_str(bundle* b, const char* key, char** str)
@@ -100,18 +98,15 @@ extern "C" bundle* bundle_dup(bundle* b)
         Fail(BUNDLE_ERROR_INVALID_PARAMETER);
         return nullptr;
     }
-    try
-    {
-        auto copy = std::make_unique<_bundle_t>();
-        for (const auto& item : b->items) copy->items.push_back(std::make_unique<keyval_t>(*item));
-        Fail(BUNDLE_ERROR_NONE);
-        return copy.release();
-    }
-    catch (const std::bad_alloc&)
-    {
-        Fail(BUNDLE_ERROR_OUT_OF_MEMORY);
-        return nullptr;
-    }
+    return platform::GuardedCall("BUNDLE", nullptr,
+                                 [&]
+                                 {
+                                     auto copy = std::make_unique<_bundle_t>();
+                                     for (const auto& item : b->items)
+                                         copy->items.push_back(std::make_unique<keyval_t>(*item));
+                                     Fail(BUNDLE_ERROR_NONE);
+                                     return copy.release();
+                                 });
 }
 
 extern "C" int bundle_encode(bundle* b, bundle_raw** raw, int* len)

@@ -2,7 +2,6 @@
 #include "bundle/BundleInternal.h"
 
 #include <cstdint>
-#include <cstdio>
 #include <string_view>
 #include <unordered_set>
 
@@ -187,43 +186,6 @@ bool Base64Decode(const char* text, size_t length, std::string& out)
             out.push_back(static_cast<char>(chunk & 0xFF));
     }
     return true;
-}
-
-std::string JsonQuote(const std::string& text)
-{
-    std::string out = "\"";
-    for (char c : text)
-    {
-        unsigned char u = static_cast<unsigned char>(c);
-        if (c == '"' || c == '\\')
-        {
-            out.push_back('\\');
-            out.push_back(c);
-        }
-        else if (u < 0x20)
-        {
-            char escaped[8];
-            snprintf(escaped, sizeof(escaped), "\\u%04x", u);
-            out += escaped;
-        }
-        else
-            out.push_back(c);
-    }
-    out.push_back('"');
-    return out;
-}
-
-std::string BundleToJson(const bundle* b)
-{
-    std::string out = "{";
-    for (const auto& item : b->items)
-    {
-        if (out.size() > 1)
-            out.push_back(',');
-        out += JsonQuote(item->key) + ":" + JsonQuote(item->value);
-    }
-    out.push_back('}');
-    return out;
 }
 
 }  // namespace platform

@@ -40,10 +40,6 @@ std::string Base64Encode(const std::string& data);
 // Strict: canonical padding only, no whitespace.
 bool Base64Decode(const char* text, size_t length, std::string& out);
 
-std::string JsonQuote(const std::string& text);
-// {"key":"value",...} in the bundle's order.
-std::string BundleToJson(const bundle* b);
-
 const keyval_t* BundleFind(const bundle* b, const std::string& key);
 
 }  // namespace platform

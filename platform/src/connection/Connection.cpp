@@ -1,9 +1,8 @@
 #include "net_connection.h"
 
-#include <algorithm>
 #include <memory>
-#include <vector>
 
+#include "ListenerList.h"
 #include "core/ApiGuard.h"
 #include "dlog.h"
 #include "vconf.h"
@@ -19,11 +18,20 @@ struct Connection
     void* userData = nullptr;
 };
 
-// Handles of this process; those with a callback share one key watch.
-std::vector<Connection*>& LiveHandles()
+typedef NSWeather::ListenerList<Connection*> HandleList;
+
+// Handles of this process.
+HandleList& LiveHandles()
 {
-    static auto* handles = new std::vector<Connection*>();
+    static auto* handles = new HandleList();
     return *handles;
+}
+
+// The handles with a callback; they share one key watch.
+HandleList& Watchers()
+{
+    static auto* watchers = new HandleList();
+    return *watchers;
 }
 
 bool gWatching = false;
@@ -34,9 +42,8 @@ int gLastType = -1;
 
 Connection* FindHandle(connection_h handle)
 {
-    auto& handles = LiveHandles();
-    auto it = std::find(handles.begin(), handles.end(), static_cast<Connection*>(handle));
-    return it == handles.end() ? nullptr : *it;
+    auto* connection = static_cast<Connection*>(handle);
+    return LiveHandles().Contains(connection) ? connection : nullptr;
 }
 
 connection_type_e TypeOfStatus(int status)
@@ -56,14 +63,6 @@ connection_type_e TypeOfStatus(int status)
     }
 }
 
-bool AnyCallbackSet()
-{
-    for (Connection* handle : LiveHandles())
-        if (handle->cb)
-            return true;
-    return false;
-}
-
 void NetworkStatusChangedCb(keynode_t* node, void*)
 {
     if (!node)
@@ -72,19 +71,13 @@ void NetworkStatusChangedCb(keynode_t* node, void*)
     if (type == gLastType)
         return;
     gLastType = type;
-    // A callback may destroy handles or unset callbacks: look each up again.
-    std::vector<Connection*> snapshot = LiveHandles();
-    for (Connection* handle : snapshot)
-    {
-        Connection* live = FindHandle(handle);
-        if (live && live->cb)
-            live->cb(type, live->userData);
-    }
+    // A callback may destroy handles or unset callbacks.
+    Watchers().Notify([type](Connection* handle) { handle->cb(type, handle->userData); });
 }
 
 void UpdateWatch()
 {
-    bool wanted = AnyCallbackSet();
+    bool wanted = !Watchers().IsEmpty();
     if (wanted && !gWatching)
     {
         int status = 0;
@@ -104,7 +97,7 @@ int ConnectionCreate(connection_h* connection)
     if (!connection)
         return CONNECTION_ERROR_INVALID_PARAMETER;
     auto handle = std::make_unique<Connection>();
-    LiveHandles().push_back(handle.get());
+    LiveHandles().Add(handle.get());
     *connection = handle.release();
     return CONNECTION_ERROR_NONE;
 }
@@ -114,8 +107,8 @@ int ConnectionDestroy(connection_h connection)
     Connection* handle = FindHandle(connection);
     if (!handle)
         return CONNECTION_ERROR_INVALID_PARAMETER;
-    auto& handles = LiveHandles();
-    handles.erase(std::find(handles.begin(), handles.end(), handle));
+    LiveHandles().Remove(handle);
+    Watchers().Remove(handle);
     delete handle;
     UpdateWatch();
     return CONNECTION_ERROR_NONE;
@@ -142,9 +135,11 @@ int ConnectionSetTypeChangedCb(connection_h connection, connection_type_changed_
         return CONNECTION_ERROR_INVALID_PARAMETER;
     handle->cb = callback;
     handle->userData = user_data;
+    Watchers().Add(handle);
     UpdateWatch();
     if (!gWatching)
     {
+        Watchers().Remove(handle);
         handle->cb = nullptr;
         handle->userData = nullptr;
         return CONNECTION_ERROR_OPERATION_FAILED;
@@ -157,6 +152,7 @@ int ConnectionUnsetTypeChangedCb(connection_h connection)
     Connection* handle = FindHandle(connection);
     if (!handle)
         return CONNECTION_ERROR_INVALID_PARAMETER;
+    Watchers().Remove(handle);
     handle->cb = nullptr;
     handle->userData = nullptr;
     UpdateWatch();

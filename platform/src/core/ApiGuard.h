@@ -5,11 +5,14 @@
 #include <new>
 #include <type_traits>
 
+#include "CallbackTrampoline.h"
 #include "dlog.h"
 #include "tizen_error.h"
 
-// Entry points of the C API are called from C: an exception that crossed
-// one would end the process. Internal to the platform library.
+// Entry points of the C API and the C callbacks the platform hands to EFL
+// are called from C: an exception that crossed one would end the process.
+// Entry points go through GuardedCall, callbacks through ForwardCallback
+// with PLATFORM_CALLBACK_SITE. Internal to the platform library.
 namespace platform
 {
 
@@ -52,6 +55,24 @@ Result GuardedCall(const char* tag, Failure failure, Body&& body) noexcept
     return static_cast<Result>(failure);
 }
 
+// The platform's report for ForwardCallback: one plain line under the
+// callback's tag naming the callback and what went wrong.
+inline void ReportCallbackProblem(const NSWeather::CallbackSite& site, bool isMissingObject,
+                                  const char* text) noexcept
+{
+    try
+    {
+        dlog_print(DLOG_ERROR, site.tag, "%s(): %d: %s: %s", site.function, site.line,
+                   isMissingObject ? "callback without its object" : "exception caught", text);
+    }
+    catch (...)
+    {
+    }
+}
+
 }  // namespace platform
+
+// Where a platform C callback is, for ForwardCallback.
+#define PLATFORM_CALLBACK_SITE(tag) WEATHER_CALLBACK_SITE_WITH(tag, platform::ReportCallbackProblem)
 
 #endif

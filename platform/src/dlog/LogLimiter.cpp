@@ -1,5 +1,7 @@
 #include "dlog/LogLimiter.h"
 
+#include "core/ApiGuard.h"
+
 namespace platform
 {
 
@@ -40,28 +42,24 @@ void LogLimiter::Summarise()
 
 Eina_Bool LogLimiter::IntervalEndCb(void* data)
 {
-    auto* limiter = static_cast<LogLimiter*>(data);
-    if (!limiter)
-        return ECORE_CALLBACK_CANCEL;
-    try
-    {
-        if (limiter->OnIntervalEnd())
-            return ECORE_CALLBACK_RENEW;
-    }
-    catch (...)
-    {
-    }
-    limiter->mTimer = nullptr;
-    return ECORE_CALLBACK_CANCEL;
+    return NSWeather::ForwardCallback<LogLimiter>(
+        data,
+        [](LogLimiter& limiter)
+        { return limiter.OnIntervalEnd() ? ECORE_CALLBACK_RENEW : ECORE_CALLBACK_CANCEL; },
+        PLATFORM_CALLBACK_SITE("DLOG"), ECORE_CALLBACK_CANCEL);
 }
 
 // A quiet interval ends the burst; a busy one gives its summary and starts
-// the next interval.
+// the next interval. The timer is forgotten first, so a failed summary
+// leaves no handle to a timer that ends.
 bool LogLimiter::OnIntervalEnd()
 {
+    Ecore_Timer* timer = mTimer;
+    mTimer = nullptr;
     if (mHeldBack == 0)
         return false;
     Summarise();
+    mTimer = timer;
     return true;
 }
 

@@ -66,8 +66,9 @@ extern "C" int i18n_udatepg_get_best_pattern(i18n_udatepg_h dtpg, const i18n_uch
         !best_pattern_len)
         return I18N_ERROR_INVALID_PARAMETER;
     UErrorCode status = U_ZERO_ERROR;
-    *best_pattern_len = udatpg_getBestPattern(static_cast<UDateTimePatternGenerator*>(dtpg), AsUChars(skeleton),
-                                              len, AsUChars(best_pattern), capacity, &status);
+    *best_pattern_len =
+        udatpg_getBestPattern(static_cast<UDateTimePatternGenerator*>(dtpg), AsUChars(skeleton), len,
+                              AsUChars(best_pattern), capacity, &status);
     return ErrorOf(status);
 }
 
@@ -86,9 +87,9 @@ extern "C" int i18n_udate_create(i18n_udate_format_style_e time_style, i18n_udat
     if (!format || tz_id_len < -1 || pattern_len < -1)
         return I18N_ERROR_INVALID_PARAMETER;
     UErrorCode status = U_ZERO_ERROR;
-    UDateFormat* made = udat_open(static_cast<UDateFormatStyle>(time_style),
-                                  static_cast<UDateFormatStyle>(date_style), locale, AsUChars(tz_id),
-                                  tz_id_len, AsUChars(pattern), pattern_len, &status);
+    UDateFormat* made =
+        udat_open(static_cast<UDateFormatStyle>(time_style), static_cast<UDateFormatStyle>(date_style),
+                  locale, AsUChars(tz_id), tz_id_len, AsUChars(pattern), pattern_len, &status);
     int result = ErrorOf(status);
     if (result != I18N_ERROR_NONE || !made)
     {

@@ -26,16 +26,14 @@ struct Converter
 int32_t BoundedLength(const char* text, int32_t n)
 {
     int32_t length = 0;
-    while (length < n && text[length])
-        ++length;
+    while (length < n && text[length]) ++length;
     return length;
 }
 
 int32_t BoundedLength(const UChar* text, int32_t n)
 {
     int32_t length = 0;
-    while (length < n && text[length])
-        ++length;
+    while (length < n && text[length]) ++length;
     return length;
 }
 
@@ -76,8 +74,8 @@ extern "C" char* i18n_ustring_copy_au_n(char* dest, const i18n_uchar* src, int32
     Converter converter;
     UErrorCode status = U_ZERO_ERROR;
     if (converter.cnv)
-        ucnv_fromUnicode(converter.cnv, &target, dest + n, &source, source + BoundedLength(source, n), nullptr,
-                         true, &status);
+        ucnv_fromUnicode(converter.cnv, &target, dest + n, &source, source + BoundedLength(source, n),
+                         nullptr, true, &status);
     bool failed = !converter.cnv || (U_FAILURE(status) && status != U_BUFFER_OVERFLOW_ERROR);
     if (failed && n > 0)
         *dest = 0;

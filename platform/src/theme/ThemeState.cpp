@@ -8,6 +8,7 @@
 #include <cstring>
 #include <memory>
 
+#include "core/ApiGuard.h"
 #include "core/PlatformRoot.h"
 #include "dlog.h"
 
@@ -248,31 +249,30 @@ int ThemeState::AddChangedCallback(int type, uxt_theme_changed_cb cb, void* user
 {
     if ((type != UXT_THEME_CHANGED_TYPE_COLOR && type != UXT_THEME_CHANGED_TYPE_FONT) || !cb)
         return UXT_THEME_ERROR_INVALID_PARAMETER;
-    bool firstOfType = true;
-    for (const Listener& listener : mListeners)
-    {
-        if (listener.type == type && listener.cb == cb)
-            return UXT_THEME_ERROR_INVALID_PARAMETER;
-        firstOfType = firstOfType && listener.type != type;
-    }
-    if (firstOfType && !WatchKeys(type, true))
+    auto& listeners = GetListeners(type);
+    if (listeners.Contains({cb, userData}))
+        return UXT_THEME_ERROR_INVALID_PARAMETER;
+    if (listeners.IsEmpty() && !WatchKeys(type, true))
         return UXT_THEME_ERROR_IO_ERROR;
-    mListeners.push_back({type, cb, userData});
+    listeners.Add({cb, userData});
     return UXT_THEME_ERROR_NONE;
 }
 
 int ThemeState::RemoveChangedCallback(int type, uxt_theme_changed_cb cb)
 {
-    auto it = std::find_if(mListeners.begin(), mListeners.end(),
-                           [&](const Listener& l) { return l.type == type && l.cb == cb; });
-    if (it == mListeners.end())
+    if (type != UXT_THEME_CHANGED_TYPE_COLOR && type != UXT_THEME_CHANGED_TYPE_FONT)
         return UXT_THEME_ERROR_INVALID_PARAMETER;
-    mListeners.erase(it);
-    bool lastOfType =
-        std::none_of(mListeners.begin(), mListeners.end(), [&](const Listener& l) { return l.type == type; });
-    if (lastOfType)
+    auto& listeners = GetListeners(type);
+    if (!listeners.Remove({cb, nullptr}))
+        return UXT_THEME_ERROR_INVALID_PARAMETER;
+    if (listeners.IsEmpty())
         WatchKeys(type, false);
     return UXT_THEME_ERROR_NONE;
+}
+
+NSWeather::ListenerList<ThemeState::Listener>& ThemeState::GetListeners(int type)
+{
+    return type == UXT_THEME_CHANGED_TYPE_COLOR ? mColorListeners : mFontListeners;
 }
 
 bool ThemeState::WatchKeys(int type, bool watch)
@@ -297,7 +297,7 @@ bool ThemeState::WatchKeys(int type, bool watch)
             vconf_ignore_key_changed(keys[i], cb);
             continue;
         }
-        if (vconf_notify_key_changed(keys[i], cb, nullptr) != VCONF_OK)
+        if (vconf_notify_key_changed(keys[i], cb, this) != VCONF_OK)
         {
             dlog_print(DLOG_ERROR, LOG_TAG, "cannot watch %s", keys[i]);
             for (size_t j = 0; j < i; ++j) vconf_ignore_key_changed(keys[j], cb);
@@ -308,46 +308,24 @@ bool ThemeState::WatchKeys(int type, bool watch)
     return ok;
 }
 
+// A callback may remove itself or others.
 void ThemeState::Notify(int type)
 {
-    // A callback may remove itself or others; call only those still there.
-    std::vector<Listener> listeners = mListeners;
-    for (const Listener& listener : listeners)
-    {
-        bool registered =
-            std::any_of(mListeners.begin(), mListeners.end(),
-                        [&](const Listener& l) { return l.type == listener.type && l.cb == listener.cb; });
-        if (listener.type == type && registered)
-            listener.cb(listener.userData);
-    }
+    GetListeners(type).Notify([](const Listener& listener) { listener.cb(listener.userData); });
 }
 
-void ThemeState::ColorKeyChangedCb(keynode_t* node, void* data)
+void ThemeState::ColorKeyChangedCb(keynode_t*, void* data)
 {
-    (void)node;
-    (void)data;
-    try
-    {
-        GetInstance().Notify(UXT_THEME_CHANGED_TYPE_COLOR);
-    }
-    catch (...)
-    {
-        dlog_print(DLOG_ERROR, LOG_TAG, "color change not delivered");
-    }
+    NSWeather::ForwardCallback<ThemeState>(
+        data, [](ThemeState& state) { state.Notify(UXT_THEME_CHANGED_TYPE_COLOR); },
+        PLATFORM_CALLBACK_SITE(LOG_TAG));
 }
 
-void ThemeState::FontKeyChangedCb(keynode_t* node, void* data)
+void ThemeState::FontKeyChangedCb(keynode_t*, void* data)
 {
-    (void)node;
-    (void)data;
-    try
-    {
-        GetInstance().Notify(UXT_THEME_CHANGED_TYPE_FONT);
-    }
-    catch (...)
-    {
-        dlog_print(DLOG_ERROR, LOG_TAG, "font change not delivered");
-    }
+    NSWeather::ForwardCallback<ThemeState>(
+        data, [](ThemeState& state) { state.Notify(UXT_THEME_CHANGED_TYPE_FONT); },
+        PLATFORM_CALLBACK_SITE(LOG_TAG));
 }
 
 }  // namespace theme

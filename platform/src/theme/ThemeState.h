@@ -6,6 +6,7 @@
 #include <string>
 #include <vector>
 
+#include "ListenerList.h"
 #include "theme/ThemeTable.h"
 #include "uxt_theme.h"
 #include "vconf.h"
@@ -43,11 +44,12 @@ public:
     int RemoveChangedCallback(int type, uxt_theme_changed_cb cb);
 
 private:
+    // One callback a type; its user data does not tell two apart.
     struct Listener
     {
-        int type;
         uxt_theme_changed_cb cb;
         void* userData;
+        bool operator==(const Listener& other) const { return cb == other.cb; }
     };
 
     ThemeState() = default;
@@ -57,6 +59,7 @@ private:
     void ClearAppliedColors();
     void ClearAppliedFonts();
     bool WatchKeys(int type, bool watch);
+    NSWeather::ListenerList<Listener>& GetListeners(int type);
     void Notify(int type);
     static void ColorKeyChangedCb(keynode_t* node, void* data);
     static void FontKeyChangedCb(keynode_t* node, void* data);
@@ -70,7 +73,8 @@ private:
     // Kept after their table is deleted: other views still show them.
     std::map<std::string, ThemeColor> mAppliedColors;
     std::set<std::string> mAppliedFontCodes;
-    std::vector<Listener> mListeners;
+    NSWeather::ListenerList<Listener> mColorListeners;
+    NSWeather::ListenerList<Listener> mFontListeners;
 };
 
 }  // namespace theme

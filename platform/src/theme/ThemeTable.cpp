@@ -7,6 +7,7 @@
 #include <cstdlib>
 #include <cstring>
 
+#include "core/ApiGuard.h"
 #include "dlog.h"
 
 namespace platform
@@ -47,8 +48,14 @@ typedef std::map<std::string, std::string> Attributes;
 
 Eina_Bool AttributeCb(void* data, const char* key, const char* value)
 {
-    static_cast<Attributes*>(data)->emplace(key, value);
-    return EINA_TRUE;
+    return NSWeather::ForwardCallback<Attributes>(
+        data,
+        [key, value](Attributes& attributes)
+        {
+            attributes.emplace(key, value);
+            return EINA_TRUE;
+        },
+        PLATFORM_CALLBACK_SITE(LOG_TAG), EINA_FALSE);
 }
 
 // Splits an element's content into its name and attributes.
@@ -102,7 +109,11 @@ private:
                              unsigned length)
     {
         (void)offset;
-        return static_cast<TableWalker*>(data)->OnToken(type, content, length) ? EINA_TRUE : EINA_FALSE;
+        return NSWeather::ForwardCallback<TableWalker>(
+            data,
+            [=](TableWalker& walker)
+            { return walker.OnToken(type, content, length) ? EINA_TRUE : EINA_FALSE; },
+            PLATFORM_CALLBACK_SITE(LOG_TAG), EINA_FALSE);
     }
 
     bool OnToken(Eina_Simple_XML_Type type, const char* content, unsigned length)

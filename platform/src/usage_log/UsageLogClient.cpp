@@ -60,19 +60,15 @@ namespace
 
 void CompletionCb(void* data)
 {
-    auto* completion = static_cast<Completion*>(data);
-    if (!completion)
-        return;
-    completion->manager->pending.remove(completion);
-    try
-    {
-        completion->callback(completion->requestId, completion->uri.c_str(), completion->userData);
-    }
-    catch (...)
-    {
-        dlog_print(DLOG_ERROR, kLogTag, "exception in the completion of request %d", completion->requestId);
-    }
-    delete completion;
+    NSWeather::ForwardCallback<Completion>(
+        data,
+        [](Completion& completion)
+        {
+            std::unique_ptr<Completion> owned(&completion);
+            completion.manager->pending.remove(&completion);
+            completion.callback(completion.requestId, completion.uri.c_str(), completion.userData);
+        },
+        PLATFORM_CALLBACK_SITE(kLogTag));
 }
 
 void ScheduleCompletion(quorvex_log_manager_h manager, int requestId, const char* uri,

@@ -7,6 +7,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include "core/ApiGuard.h"
 #include "core/PlatformRoot.h"
 #include "dlog.h"
 
@@ -136,16 +137,8 @@ const WatchRegistry::Registration* WatchRegistry::Find(uint64_t id) const
 
 Eina_Bool WatchRegistry::FdReadableCb(void* data, Ecore_Fd_Handler*)
 {
-    if (!data)
-        return ECORE_CALLBACK_RENEW;
-    try
-    {
-        static_cast<WatchRegistry*>(data)->OnReadable();
-    }
-    catch (...)
-    {
-        dlog_print(DLOG_ERROR, kLogTag, "exception while delivering key changes");
-    }
+    NSWeather::ForwardCallback<WatchRegistry>(
+        data, [](WatchRegistry& registry) { registry.OnReadable(); }, PLATFORM_CALLBACK_SITE(kLogTag));
     return ECORE_CALLBACK_RENEW;
 }
 

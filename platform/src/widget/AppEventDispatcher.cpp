@@ -8,6 +8,7 @@
 #include <cstring>
 #include <locale.h>
 
+#include "core/ApiGuard.h"
 #include "dlog.h"
 
 namespace platform
@@ -32,25 +33,17 @@ std::string ReadString(const char* key)
     return text;
 }
 
+std::string TextOf(keynode_t* node)
+{
+    const char* value = node ? vconf_keynode_get_str(node) : nullptr;
+    return value ? value : "";
+}
+
 bool IsBatteryLow(int value)
 {
     return value == APP_EVENT_LOW_BATTERY_POWER_OFF || value == APP_EVENT_LOW_BATTERY_CRITICAL_LOW;
 }
 
-template <typename Fn>
-void Guarded(void* data, Fn fn)
-{
-    if (!data)
-        return;
-    try
-    {
-        fn(*static_cast<AppEventDispatcher*>(data));
-    }
-    catch (...)
-    {
-        dlog_print(DLOG_ERROR, kLogTag, "application event failed with an exception");
-    }
-}
 }  // namespace
 
 AppEventDispatcher& AppEventDispatcher::GetInstance()
@@ -68,11 +61,11 @@ int AppEventDispatcher::AddHandler(app_event_handler_h* handler, app_event_type_
         return TIZEN_ERROR_NOT_SUPPORTED;
     if (type < APP_EVENT_LOW_MEMORY || type > APP_EVENT_REGION_FORMAT_CHANGED)
         return APP_ERROR_INVALID_PARAMETER;
-    for (auto& existing : mHandlers)
-        if (existing->type == type && existing->callback == callback)
-            return APP_ERROR_INVALID_PARAMETER;
+    if (GetListeners(type).Contains({callback, userData}))
+        return APP_ERROR_INVALID_PARAMETER;
     if (!Watch(type, true))
         dlog_print(DLOG_ERROR, kLogTag, "no key watch for event %d; it is raised only by the host", type);
+    GetListeners(type).Add({callback, userData});
     mHandlers.push_back(std::make_unique<app_event_handler>(app_event_handler{type, callback, userData}));
     *handler = mHandlers.back().get();
     return APP_ERROR_NONE;
@@ -84,19 +77,17 @@ int AppEventDispatcher::RemoveHandler(app_event_handler_h handler)
                               [handler](const auto& item) { return item.get() == handler; });
     if (!handler || found == mHandlers.end())
         return APP_ERROR_INVALID_PARAMETER;
-    app_event_type_e type = handler->type;
+    Listeners& listeners = GetListeners(handler->type);
+    listeners.Remove({handler->callback, nullptr});
+    if (listeners.IsEmpty())
+        Watch(handler->type, false);
     mHandlers.erase(found);
-    bool stillWanted = std::any_of(mHandlers.begin(), mHandlers.end(),
-                                   [type](const auto& item) { return item->type == type; });
-    if (!stillWanted)
-        Watch(type, false);
     return APP_ERROR_NONE;
 }
 
 void AppEventDispatcher::Clear()
 {
-    while (!mHandlers.empty())
-        RemoveHandler(mHandlers.back().get());
+    while (!mHandlers.empty()) RemoveHandler(mHandlers.back().get());
 }
 
 bool AppEventDispatcher::Watch(app_event_type_e type, bool on)
@@ -107,8 +98,7 @@ bool AppEventDispatcher::Watch(app_event_type_e type, bool on)
         {APP_EVENT_LOW_BATTERY, VCONFKEY_SYSMAN_BATTERY_STATUS_LOW, BatteryKeyCb},
         {APP_EVENT_LOW_MEMORY, VCONFKEY_SYSMAN_LOW_MEMORY, MemoryKeyCb},
     };
-    bool alreadyWatched = std::count_if(mHandlers.begin(), mHandlers.end(),
-                                        [type](const auto& item) { return item->type == type; }) > 0;
+    bool alreadyWatched = !GetListeners(type).IsEmpty();
     for (const auto& watch : kWatches)
     {
         if (watch.type != type)
@@ -124,43 +114,40 @@ bool AppEventDispatcher::Watch(app_event_type_e type, bool on)
 
 void AppEventDispatcher::Dispatch(const app_event_info& info)
 {
-    std::vector<app_event_handler*> targets;
-    for (auto& handler : mHandlers)
-        if (handler->type == info.type)
-            targets.push_back(handler.get());
-    for (app_event_handler* target : targets)
-    {
-        // A handler may remove another one (or itself) while we go.
-        bool alive = std::any_of(mHandlers.begin(), mHandlers.end(),
-                                 [target](const auto& item) { return item.get() == target; });
-        if (alive)
-            target->callback(const_cast<app_event_info*>(&info), target->userData);
-    }
+    // A handler may remove another one (or itself) while we go.
+    GetListeners(info.type).Notify(
+        [&info](const Listener& listener)
+        { listener.callback(const_cast<app_event_info*>(&info), listener.userData); });
+}
+
+AppEventDispatcher::Listeners& AppEventDispatcher::GetListeners(app_event_type_e type)
+{
+    return mListeners[type];
 }
 
 int AppEventDispatcher::Raise(app_event_type_e type)
 {
     switch (type)
     {
-    case APP_EVENT_LANGUAGE_CHANGED:
-        OnLanguage(ReadString(VCONFKEY_LANGSET));
-        return APP_ERROR_NONE;
-    case APP_EVENT_REGION_FORMAT_CHANGED:
-        OnRegionFormat(ReadString(VCONFKEY_REGIONFORMAT));
-        return APP_ERROR_NONE;
-    case APP_EVENT_LOW_BATTERY:
-    {
-        int value = 0;
-        if (vconf_get_int(VCONFKEY_SYSMAN_BATTERY_STATUS_LOW, &value) != VCONF_OK || !IsBatteryLow(value))
-            value = APP_EVENT_LOW_BATTERY_CRITICAL_LOW;
-        OnBattery(value);
-        return APP_ERROR_NONE;
-    }
-    case APP_EVENT_LOW_MEMORY:
-        OnMemory(APP_EVENT_LOW_MEMORY_SOFT_WARNING);
-        return APP_ERROR_NONE;
-    default:
-        return APP_ERROR_INVALID_PARAMETER;
+        case APP_EVENT_LANGUAGE_CHANGED:
+            OnLanguage(ReadString(VCONFKEY_LANGSET));
+            return APP_ERROR_NONE;
+        case APP_EVENT_REGION_FORMAT_CHANGED:
+            OnRegionFormat(ReadString(VCONFKEY_REGIONFORMAT));
+            return APP_ERROR_NONE;
+        case APP_EVENT_LOW_BATTERY:
+        {
+            int value = 0;
+            if (vconf_get_int(VCONFKEY_SYSMAN_BATTERY_STATUS_LOW, &value) != VCONF_OK || !IsBatteryLow(value))
+                value = APP_EVENT_LOW_BATTERY_CRITICAL_LOW;
+            OnBattery(value);
+            return APP_ERROR_NONE;
+        }
+        case APP_EVENT_LOW_MEMORY:
+            OnMemory(APP_EVENT_LOW_MEMORY_SOFT_WARNING);
+            return APP_ERROR_NONE;
+        default:
+            return APP_ERROR_INVALID_PARAMETER;
     }
 }
 
@@ -228,7 +215,8 @@ bool AppEventDispatcher::ApplyRegionFormat(const std::string& locale)
     locale_t probe = newlocale(LC_TIME_MASK, locale.c_str(), static_cast<locale_t>(0));
     if (!probe)
     {
-        dlog_print(DLOG_ERROR, kLogTag, "region format %s is not installed; LC_TIME unchanged", locale.c_str());
+        dlog_print(DLOG_ERROR, kLogTag, "region format %s is not installed; LC_TIME unchanged",
+                   locale.c_str());
         return false;
     }
     freelocale(probe);
@@ -257,33 +245,36 @@ void AppEventDispatcher::ApplyStartupKeys()
 
 void AppEventDispatcher::LanguageKeyCb(keynode_t* node, void* data)
 {
-    Guarded(data, [node](AppEventDispatcher& self) {
-        const char* value = node ? vconf_keynode_get_str(node) : nullptr;
-        self.OnLanguage(value ? value : "");
-    });
+    NSWeather::ForwardCallback<AppEventDispatcher>(
+        data, [node](AppEventDispatcher& self) { self.OnLanguage(TextOf(node)); },
+        PLATFORM_CALLBACK_SITE(kLogTag));
 }
 
 void AppEventDispatcher::RegionKeyCb(keynode_t* node, void* data)
 {
-    Guarded(data, [node](AppEventDispatcher& self) {
-        const char* value = node ? vconf_keynode_get_str(node) : nullptr;
-        self.OnRegionFormat(value ? value : "");
-    });
+    NSWeather::ForwardCallback<AppEventDispatcher>(
+        data, [node](AppEventDispatcher& self) { self.OnRegionFormat(TextOf(node)); },
+        PLATFORM_CALLBACK_SITE(kLogTag));
 }
 
 void AppEventDispatcher::BatteryKeyCb(keynode_t* node, void* data)
 {
-    Guarded(data, [node](AppEventDispatcher& self) { self.OnBattery(node ? vconf_keynode_get_int(node) : -1); });
+    NSWeather::ForwardCallback<AppEventDispatcher>(
+        data, [node](AppEventDispatcher& self) { self.OnBattery(node ? vconf_keynode_get_int(node) : -1); },
+        PLATFORM_CALLBACK_SITE(kLogTag));
 }
 
 void AppEventDispatcher::MemoryKeyCb(keynode_t* node, void* data)
 {
-    Guarded(data, [node](AppEventDispatcher& self) { self.OnMemory(node ? vconf_keynode_get_int(node) : -1); });
+    NSWeather::ForwardCallback<AppEventDispatcher>(
+        data, [node](AppEventDispatcher& self) { self.OnMemory(node ? vconf_keynode_get_int(node) : -1); },
+        PLATFORM_CALLBACK_SITE(kLogTag));
 }
 
 }  // namespace platform
 
-extern "C" int app_event_get_low_memory_status(app_event_info_h event_info, app_event_low_memory_status_e* status)
+extern "C" int app_event_get_low_memory_status(app_event_info_h event_info,
+                                               app_event_low_memory_status_e* status)
 {
     if (!event_info || !status)
         return APP_ERROR_INVALID_PARAMETER;
@@ -293,7 +284,8 @@ extern "C" int app_event_get_low_memory_status(app_event_info_h event_info, app_
     return APP_ERROR_NONE;
 }
 
-extern "C" int app_event_get_low_battery_status(app_event_info_h event_info, app_event_low_battery_status_e* status)
+extern "C" int app_event_get_low_battery_status(app_event_info_h event_info,
+                                                app_event_low_battery_status_e* status)
 {
     if (!event_info || !status)
         return APP_ERROR_INVALID_PARAMETER;

@@ -5,6 +5,7 @@
 #include <string>
 #include <vector>
 
+#include "ListenerList.h"
 #include "app_common.h"
 #include "vconf.h"
 
@@ -33,7 +34,8 @@ class AppEventDispatcher
 public:
     static AppEventDispatcher& GetInstance();
 
-    int AddHandler(app_event_handler_h* handler, app_event_type_e type, app_event_cb callback, void* userData);
+    int AddHandler(app_event_handler_h* handler, app_event_type_e type, app_event_cb callback,
+                   void* userData);
     int RemoveHandler(app_event_handler_h handler);
     // Removes every handler and key watch (the process ends its host).
     void Clear();
@@ -50,7 +52,17 @@ public:
     static bool ApplyRegionFormat(const std::string& locale);
 
 private:
+    // One callback an event type; its user data does not tell two apart.
+    struct Listener
+    {
+        app_event_cb callback;
+        void* userData;
+        bool operator==(const Listener& other) const { return callback == other.callback; }
+    };
+    typedef NSWeather::ListenerList<Listener> Listeners;
+
     AppEventDispatcher() = default;
+    Listeners& GetListeners(app_event_type_e type);
 
     void Dispatch(const app_event_info& info);
     bool Watch(app_event_type_e type, bool on);
@@ -64,7 +76,9 @@ private:
     static void BatteryKeyCb(keynode_t* node, void* data);
     static void MemoryKeyCb(keynode_t* node, void* data);
 
+    // The handles given out; the listeners of each type are called.
     std::vector<std::unique_ptr<app_event_handler>> mHandlers;
+    Listeners mListeners[APP_EVENT_REGION_FORMAT_CHANGED + 1];
 };
 
 }  // namespace platform

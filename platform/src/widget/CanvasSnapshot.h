@@ -20,7 +20,8 @@ public:
 private:
     // Windows on a display: a snapshot image over the whole canvas catches
     // what the canvas draws below it, whatever the window's stacking on screen.
-    static std::string CaptureWithSnapshotObject(Ecore_Evas* ee, const std::string& path, int width, int height);
+    static std::string CaptureWithSnapshotObject(Ecore_Evas* ee, const std::string& path, int width,
+                                                 int height);
     static std::string WritePixels(const void* pixels, int width, int height, const std::string& path);
 };
 

@@ -5,6 +5,7 @@
 #include <sys/socket.h>
 #include <unistd.h>
 
+#include "core/ApiGuard.h"
 #include "core/PlatformRoot.h"
 #include "core/UnixSocket.h"
 #include "widget_errno.h"
@@ -86,16 +87,8 @@ void ControlServer::Stop()
 
 Eina_Bool ControlServer::AcceptCb(void* data, Ecore_Fd_Handler*)
 {
-    if (!data)
-        return ECORE_CALLBACK_RENEW;
-    try
-    {
-        static_cast<ControlServer*>(data)->Accept();
-    }
-    catch (...)
-    {
-        dlog_print(DLOG_ERROR, kLogTag, "accept failed with an exception");
-    }
+    NSWeather::ForwardCallback<ControlServer>(
+        data, [](ControlServer& server) { server.Accept(); }, PLATFORM_CALLBACK_SITE(kLogTag));
     return ECORE_CALLBACK_RENEW;
 }
 
@@ -143,31 +136,30 @@ void ControlServer::PauseAccept()
 
 Eina_Bool ControlServer::ResumeAcceptCb(void* data)
 {
-    auto* server = static_cast<ControlServer*>(data);
-    if (!server)
-        return ECORE_CALLBACK_CANCEL;
-    server->mAcceptPauseTimer = nullptr;
-    if (server->mListenFd >= 0 && !server->mListenHandler)
-        server->mListenHandler =
-            ecore_main_fd_handler_add(server->mListenFd, ECORE_FD_READ, AcceptCb, server, nullptr, nullptr);
+    NSWeather::ForwardCallback<ControlServer>(
+        data, [](ControlServer& server) { server.ResumeAccept(); }, PLATFORM_CALLBACK_SITE(kLogTag));
     return ECORE_CALLBACK_CANCEL;
+}
+
+void ControlServer::ResumeAccept()
+{
+    mAcceptPauseTimer = nullptr;
+    if (mListenFd >= 0 && !mListenHandler)
+        mListenHandler =
+            ecore_main_fd_handler_add(mListenFd, ECORE_FD_READ, AcceptCb, this, nullptr, nullptr);
 }
 
 Eina_Bool ControlServer::ClientCb(void* data, Ecore_Fd_Handler* handler)
 {
-    auto* client = static_cast<Client*>(data);
-    if (!client || !client->server)
-        return ECORE_CALLBACK_RENEW;
-    bool isReadable = ecore_main_fd_handler_active_get(handler, ECORE_FD_READ);
-    bool isWritable = ecore_main_fd_handler_active_get(handler, ECORE_FD_WRITE);
-    try
-    {
-        client->server->OnClientReady(client->id, isReadable, isWritable);
-    }
-    catch (...)
-    {
-        dlog_print(DLOG_ERROR, kLogTag, "control client failed with an exception");
-    }
+    NSWeather::ForwardCallback<Client>(
+        data,
+        [handler](Client& client)
+        {
+            bool isReadable = ecore_main_fd_handler_active_get(handler, ECORE_FD_READ);
+            bool isWritable = ecore_main_fd_handler_active_get(handler, ECORE_FD_WRITE);
+            client.server->OnClientReady(client.id, isReadable, isWritable);
+        },
+        PLATFORM_CALLBACK_SITE(kLogTag));
     return ECORE_CALLBACK_RENEW;
 }
 

@@ -57,6 +57,7 @@ private:
     static Eina_Bool AcceptCb(void* data, Ecore_Fd_Handler* handler);
     static Eina_Bool ClientCb(void* data, Ecore_Fd_Handler* handler);
     static Eina_Bool ResumeAcceptCb(void* data);
+    void ResumeAccept();
     void Accept();
     void PauseAccept();
     void OnClientReady(unsigned clientId, bool isReadable, bool isWritable);

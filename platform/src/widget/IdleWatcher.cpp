@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "core/ApiGuard.h"
 #include "dlog.h"
 
 namespace platform
@@ -49,7 +50,8 @@ void IdleWatcher::HookCanvases()
     std::vector<Evas*> canvases = mCanvases();
     // Canvases of instances that have gone are forgotten; their callbacks went with them.
     for (auto it = mHooked.begin(); it != mHooked.end();)
-        it = std::find(canvases.begin(), canvases.end(), *it) == canvases.end() ? mHooked.erase(it) : std::next(it);
+        it = std::find(canvases.begin(), canvases.end(), *it) == canvases.end() ? mHooked.erase(it)
+                                                                                : std::next(it);
     for (Evas* canvas : canvases)
     {
         if (mHooked.insert(canvas).second)
@@ -61,43 +63,38 @@ void IdleWatcher::RenderPostCb(void* data, Evas*, void* eventInfo)
 {
     // Only draws that changed pixels count; the data is the watcher itself.
     auto* post = static_cast<Evas_Event_Render_Post*>(eventInfo);
-    if (!data || (post && !post->updated_area))
+    if (post && !post->updated_area)
         return;
-    static_cast<IdleWatcher*>(data)->mLastChange = ecore_time_get();
+    NSWeather::ForwardCallback<IdleWatcher>(
+        data, [](IdleWatcher& watcher) { watcher.mLastChange = ecore_time_get(); },
+        PLATFORM_CALLBACK_SITE(kLogTag));
 }
 
 Eina_Bool IdleWatcher::TickCb(void* data)
 {
-    auto* waiter = static_cast<Waiter*>(data);
-    if (!waiter)
-        return ECORE_CALLBACK_CANCEL;
-    try
-    {
-        // The check runs from an idler: it only gets there once queued jobs ran.
-        if (!waiter->idler)
-            waiter->idler = ecore_idler_add(IdlerCb, waiter);
-    }
-    catch (...)
-    {
-        dlog_print(DLOG_ERROR, kLogTag, "idle tick failed with an exception");
-    }
-    return ECORE_CALLBACK_RENEW;
+    // The check runs from an idler: it only gets there once queued jobs ran.
+    // The waiter owns its timer, so the timer stays even when a tick fails.
+    return NSWeather::ForwardCallback<Waiter>(
+        data,
+        [](Waiter& waiter)
+        {
+            if (!waiter.idler)
+                waiter.idler = ecore_idler_add(IdlerCb, &waiter);
+            return ECORE_CALLBACK_RENEW;
+        },
+        PLATFORM_CALLBACK_SITE(kLogTag), ECORE_CALLBACK_RENEW);
 }
 
 Eina_Bool IdleWatcher::IdlerCb(void* data)
 {
-    auto* waiter = static_cast<Waiter*>(data);
-    if (!waiter)
-        return ECORE_CALLBACK_CANCEL;
-    waiter->idler = nullptr;
-    try
-    {
-        waiter->watcher->Check(waiter);
-    }
-    catch (...)
-    {
-        dlog_print(DLOG_ERROR, kLogTag, "idle check failed with an exception");
-    }
+    NSWeather::ForwardCallback<Waiter>(
+        data,
+        [](Waiter& waiter)
+        {
+            waiter.idler = nullptr;
+            waiter.watcher->Check(&waiter);
+        },
+        PLATFORM_CALLBACK_SITE(kLogTag));
     return ECORE_CALLBACK_CANCEL;
 }
 

@@ -17,6 +17,7 @@ public:
     // Down at the start, moves about every 16 ms along the line, up at the
     // end `durationMs` after the down.
     static unsigned Swipe(Evas* canvas, int x1, int y1, int x2, int y2, unsigned durationMs);
+
 private:
     static unsigned NextTimestamp();
     static void Begin(Evas* canvas, int x, int y, unsigned timestamp);

@@ -28,8 +28,8 @@ bool IsType(Evas_Object* object, const char* type)
 
 bool IsElmImage(Evas_Object* object)
 {
-    return IsType(object, "elm_image") || IsType(object, "elm_icon") || IsType(object, "Efl.Ui.Image_Legacy") ||
-           IsType(object, "Elm.Icon");
+    return IsType(object, "elm_image") || IsType(object, "elm_icon") ||
+           IsType(object, "Efl.Ui.Image_Legacy") || IsType(object, "Elm.Icon");
 }
 
 std::string Field(const std::string& name, const std::string& jsonValue)
@@ -40,8 +40,7 @@ std::string Field(const std::string& name, const std::string& jsonValue)
 std::string Join(const std::vector<std::string>& items)
 {
     std::string out;
-    for (const auto& item : items)
-        out += (out.empty() ? "" : ",") + item;
+    for (const auto& item : items) out += (out.empty() ? "" : ",") + item;
     return out;
 }
 }  // namespace
@@ -61,30 +60,30 @@ std::string ObjectTreeDumper::Quote(const std::string& text)
     {
         switch (c)
         {
-        case '"':
-            out += "\\\"";
-            break;
-        case '\\':
-            out += "\\\\";
-            break;
-        case '\n':
-            out += "\\n";
-            break;
-        case '\t':
-            out += "\\t";
-            break;
-        case '\r':
-            out += "\\r";
-            break;
-        default:
-            if (c < 0x20)
-            {
-                char escaped[8];
-                snprintf(escaped, sizeof(escaped), "\\u%04x", c);
-                out += escaped;
-            }
-            else
-                out += static_cast<char>(c);
+            case '"':
+                out += "\\\"";
+                break;
+            case '\\':
+                out += "\\\\";
+                break;
+            case '\n':
+                out += "\\n";
+                break;
+            case '\t':
+                out += "\\t";
+                break;
+            case '\r':
+                out += "\\r";
+                break;
+            default:
+                if (c < 0x20)
+                {
+                    char escaped[8];
+                    snprintf(escaped, sizeof(escaped), "\\u%04x", c);
+                    out += escaped;
+                }
+                else
+                    out += static_cast<char>(c);
         }
     }
     return out + "\"";
@@ -121,8 +120,8 @@ std::string ObjectTreeDumper::DumpObject(Evas_Object* object, int depth)
     int x = 0, y = 0, w = 0, h = 0;
     evas_object_geometry_get(object, &x, &y, &w, &h);
     fields.push_back(Field("visible", evas_object_visible_get(object) ? "true" : "false"));
-    fields.push_back(Field("geometry", "[" + std::to_string(x) + "," + std::to_string(y) + "," + std::to_string(w) +
-                                           "," + std::to_string(h) + "]"));
+    fields.push_back(Field("geometry", "[" + std::to_string(x) + "," + std::to_string(y) + "," +
+                                           std::to_string(w) + "," + std::to_string(h) + "]"));
     if (efl_isa(object, efl_canvas_layout_class_get()))
     {
         fields.push_back(DescribeLayout(object, swallowed, depth));
@@ -148,7 +147,8 @@ std::string ObjectTreeDumper::DumpObject(Evas_Object* object, int depth)
     return "{" + Join(fields) + "}";
 }
 
-std::string ObjectTreeDumper::DescribeLayout(Evas_Object* layout, std::vector<Evas_Object*>& swallowed, int depth)
+std::string ObjectTreeDumper::DescribeLayout(Evas_Object* layout, std::vector<Evas_Object*>& swallowed,
+                                             int depth)
 {
     const char* file = nullptr;
     const char* group = nullptr;
@@ -186,7 +186,8 @@ std::string ObjectTreeDumper::DescribeImage(Evas_Object* object)
     return Field("file", Quote(file ? file : "")) + "," + Field("group", Quote(group ? group : ""));
 }
 
-std::string ObjectTreeDumper::DumpChildren(Evas_Object* object, const std::vector<Evas_Object*>& skip, int depth)
+std::string ObjectTreeDumper::DumpChildren(Evas_Object* object, const std::vector<Evas_Object*>& skip,
+                                           int depth)
 {
     if (!efl_isa(object, efl_canvas_group_class_get()))
         return std::string();
@@ -205,7 +206,8 @@ std::string ObjectTreeDumper::DumpChildren(Evas_Object* object, const std::vecto
     return Join(children);
 }
 
-const ObjectTreeDumper::PartList& ObjectTreeDumper::GetParts(const std::string& file, const std::string& group)
+const ObjectTreeDumper::PartList& ObjectTreeDumper::GetParts(const std::string& file,
+                                                             const std::string& group)
 {
     std::string key = file + "\n" + group;
     auto found = mPartCache.find(key);

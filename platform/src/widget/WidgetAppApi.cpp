@@ -26,7 +26,8 @@ WidgetInstance* FindContext(widget_context_h context)
 }
 }  // namespace
 
-extern "C" int widget_app_main(int argc, char** argv, widget_app_lifecycle_callback_s* callback, void* user_data)
+extern "C" int widget_app_main(int argc, char** argv, widget_app_lifecycle_callback_s* callback,
+                               void* user_data)
 {
     return WidgetHost::GetInstance().Run(argc, argv, callback, user_data);
 }
@@ -58,7 +59,8 @@ extern "C" int widget_app_foreach_context(widget_context_cb callback, void* data
 extern "C" int widget_app_add_event_handler(app_event_handler_h* event_handler, app_event_type_e event_type,
                                             app_event_cb callback, void* user_data)
 {
-    return platform::AppEventDispatcher::GetInstance().AddHandler(event_handler, event_type, callback, user_data);
+    return platform::AppEventDispatcher::GetInstance().AddHandler(event_handler, event_type, callback,
+                                                                  user_data);
 }
 
 extern "C" int widget_app_remove_event_handler(app_event_handler_h event_handler)
@@ -78,7 +80,8 @@ extern "C" const char* widget_app_get_id(widget_context_h context)
     return instance->GetId().c_str();
 }
 
-extern "C" widget_class_h widget_app_class_create(widget_instance_lifecycle_callback_s callback, void* user_data)
+extern "C" widget_class_h widget_app_class_create(widget_instance_lifecycle_callback_s callback,
+                                                  void* user_data)
 {
     auto* widgetClass = new (std::nothrow) _widget_class{callback, user_data};
     set_last_result(widgetClass ? WIDGET_ERROR_NONE : WIDGET_ERROR_OUT_OF_MEMORY);

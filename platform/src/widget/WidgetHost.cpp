@@ -7,6 +7,7 @@
 #include <cstdlib>
 #include <cstring>
 
+#include "core/ApiGuard.h"
 #include "app_common.h"
 #include "core/PlatformRoot.h"
 #include "dlog.h"
@@ -185,10 +186,8 @@ void WidgetHost::StopApplication()
 void WidgetHost::DestroyAllInstances()
 {
     std::vector<std::string> ids;
-    for (auto& instance : mInstances)
-        ids.push_back(instance->GetId());
-    for (auto& id : ids)
-        DestroyInstance(id, WIDGET_APP_DESTROY_TYPE_TEMPORARY);
+    for (auto& instance : mInstances) ids.push_back(instance->GetId());
+    for (auto& id : ids) DestroyInstance(id, WIDGET_APP_DESTROY_TYPE_TEMPORARY);
 }
 
 int WidgetHost::Exit()
@@ -210,7 +209,8 @@ int WidgetHost::CreateInstance(int sizeType, std::string& id)
     mInstances.push_back(std::make_unique<WidgetInstance>(id, sizeType, width, height));
     WidgetInstance* instance = mInstances.back().get();
     const auto& cb = mClass->callbacks;
-    int result = cb.create ? cb.create(instance, nullptr, width, height, mClass->userData) : WIDGET_ERROR_NONE;
+    int result =
+        cb.create ? cb.create(instance, nullptr, width, height, mClass->userData) : WIDGET_ERROR_NONE;
     if (result != WIDGET_ERROR_NONE)
     {
         dlog_print(DLOG_ERROR, kLogTag, "create of %s failed (%d); removed", id.c_str(), result);
@@ -326,16 +326,8 @@ int WidgetHost::TriggerUpdate(const std::string& id, bundle* content, int force)
 
 void WidgetHost::FlushUpdatesCb(void* data)
 {
-    if (!data)
-        return;
-    try
-    {
-        static_cast<WidgetHost*>(data)->FlushUpdates();
-    }
-    catch (...)
-    {
-        dlog_print(DLOG_ERROR, kLogTag, "update failed with an exception");
-    }
+    NSWeather::ForwardCallback<WidgetHost>(
+        data, [](WidgetHost& host) { host.FlushUpdates(); }, PLATFORM_CALLBACK_SITE(kLogTag));
 }
 
 void WidgetHost::FlushUpdates()
@@ -349,10 +341,8 @@ void WidgetHost::FlushUpdates()
         if (!update.id.empty())
             ids.push_back(update.id);
         else
-            for (auto& instance : mInstances)
-                ids.push_back(instance->GetId());
-        for (auto& id : ids)
-            UpdateInstance(id, update.content, update.force);
+            for (auto& instance : mInstances) ids.push_back(instance->GetId());
+        for (auto& id : ids) UpdateInstance(id, update.content, update.force);
         if (update.content)
             bundle_free(update.content);
     }
@@ -371,16 +361,8 @@ int WidgetHost::TerminateContext(widget_context_h context)
 
 void WidgetHost::TerminateJobCb(void* data)
 {
-    if (!data)
-        return;
-    try
-    {
-        static_cast<WidgetHost*>(data)->FlushTerminations();
-    }
-    catch (...)
-    {
-        dlog_print(DLOG_ERROR, kLogTag, "terminate failed with an exception");
-    }
+    NSWeather::ForwardCallback<WidgetHost>(
+        data, [](WidgetHost& host) { host.FlushTerminations(); }, PLATFORM_CALLBACK_SITE(kLogTag));
 }
 
 void WidgetHost::FlushTerminations()
@@ -426,8 +408,7 @@ WidgetInstance* WidgetHost::FindInstanceByCanvas(const Evas* canvas) const
 std::vector<WidgetInstance*> WidgetHost::GetInstances() const
 {
     std::vector<WidgetInstance*> result;
-    for (auto& instance : mInstances)
-        result.push_back(instance.get());
+    for (auto& instance : mInstances) result.push_back(instance.get());
     return result;
 }
 

@@ -4,6 +4,7 @@
 
 #include <cstring>
 
+#include "core/ApiGuard.h"
 #include "dlog.h"
 #include "widget/WidgetHost.h"
 
@@ -144,39 +145,24 @@ void WidgetInstance::WindowResizeCb(void*, Evas_Object* window, Evas_Coord width
 
 void WidgetInstance::WindowDelCb(void* data, Evas*, Evas_Object*, void*)
 {
-    if (!data)
-        return;
-    try
-    {
-        static_cast<WidgetInstance*>(data)->OnWindowDeleted();
-    }
-    catch (...)
-    {
-        dlog_print(DLOG_ERROR, kLogTag, "window deletion failed with an exception");
-    }
+    NSWeather::ForwardCallback<WidgetInstance>(
+        data, [](WidgetInstance& instance) { instance.OnWindowDeleted(); }, PLATFORM_CALLBACK_SITE(kLogTag));
 }
 
 void WidgetInstance::ParentDelCb(void* data, Evas*, Evas_Object*, void*)
 {
-    if (!data)
-        return;
-    static_cast<WidgetInstance*>(data)->mParentObject = nullptr;
+    NSWeather::ForwardCallback<WidgetInstance>(
+        data, [](WidgetInstance& instance) { instance.mParentObject = nullptr; },
+        PLATFORM_CALLBACK_SITE(kLogTag));
 }
 
 // Closing a window on a display removes the instance, as removing it from a
 // home screen would; the end itself runs later on the main loop.
 void WidgetInstance::CloseRequestCb(void* data, Evas_Object*, void*)
 {
-    if (!data)
-        return;
-    try
-    {
-        WidgetHost::GetInstance().TerminateContext(static_cast<WidgetInstance*>(data));
-    }
-    catch (...)
-    {
-        dlog_print(DLOG_ERROR, kLogTag, "closing a window failed with an exception");
-    }
+    NSWeather::ForwardCallback<WidgetInstance>(
+        data, [](WidgetInstance& instance) { WidgetHost::GetInstance().TerminateContext(&instance); },
+        PLATFORM_CALLBACK_SITE(kLogTag));
 }
 
 void WidgetInstance::OnWindowDeleted()

@@ -61,7 +61,8 @@ extern "C" int widget_service_get_size_type(int width, int height, widget_size_t
     return WIDGET_ERROR_INVALID_PARAMETER;
 }
 
-extern "C" int widget_service_trigger_update(const char* widget_id, const char* instance_id, bundle* b, int force)
+extern "C" int widget_service_trigger_update(const char* widget_id, const char* instance_id, bundle* b,
+                                             int force)
 {
     if (!widget_id)
         return WIDGET_ERROR_INVALID_PARAMETER;

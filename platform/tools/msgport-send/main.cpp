@@ -12,8 +12,9 @@ namespace
 
 void Usage(FILE* out)
 {
-    fprintf(out, "usage: msgport-send <app id> <port> [key=value ...]\n"
-                 "       msgport-send --help\n");
+    fprintf(out,
+            "usage: msgport-send <app id> <port> [key=value ...]\n"
+            "       msgport-send --help\n");
 }
 
 const char* ErrorName(int error)

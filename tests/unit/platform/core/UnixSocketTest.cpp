@@ -20,8 +20,7 @@ class UnixSocketTest : public WeatherTest::PlatformTest
 protected:
     void TearDown() override
     {
-        for (int fd : mFds)
-            close(fd);
+        for (int fd : mFds) close(fd);
     }
 
     UnixBindResult Bind(const std::string& path, int type, int& fd)

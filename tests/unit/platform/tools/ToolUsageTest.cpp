@@ -42,20 +42,6 @@ protected:
     std::string mErr;
 };
 
-TEST_F(ToolUsageTest, HelpPrintsTheUsageAndSucceeds)
-{
-    for (const Tool& tool : kTools)
-    {
-        for (const char* option : {"--help", "-h"})
-        {
-            SCOPED_TRACE(std::string(tool.name) + " " + option);
-            EXPECT_EQ(0, Run(tool, option));
-            EXPECT_EQ(0u, mOut.find(std::string("usage: ") + tool.name)) << mOut;
-            EXPECT_EQ("", mErr);
-        }
-    }
-}
-
 TEST_F(ToolUsageTest, BadUsageStillFailsOnTheErrorStream)
 {
     for (const Tool& tool : kTools)

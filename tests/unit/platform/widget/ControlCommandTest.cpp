@@ -44,7 +44,9 @@ TEST(ControlCommand, CallbackFailuresBecomeErrWithTheirCode)
 TEST(ControlCommand, DumpTextsAreValidJsonStrings)
 {
     EXPECT_EQ(ObjectTreeDumper::Quote("Seoul \"12\"\n\\"), "\"Seoul \\\"12\\\"\\n\\\\\"");
-    EXPECT_EQ(ObjectTreeDumper::Quote(std::string("a\x01" "b")), "\"a\\u0001b\"");
+    EXPECT_EQ(ObjectTreeDumper::Quote(std::string("a\x01"
+                                                  "b")),
+              "\"a\\u0001b\"");
     EXPECT_EQ(ObjectTreeDumper::Quote("서울"), "\"서울\"");
 }
 
@@ -67,7 +69,8 @@ TEST(AppEvents, HandlerRulesFollowThePlatform)
               TIZEN_ERROR_NOT_SUPPORTED);
     EXPECT_EQ(dispatcher.AddHandler(&handler, static_cast<app_event_type_e>(9), callback, nullptr),
               APP_ERROR_INVALID_PARAMETER);
-    EXPECT_EQ(dispatcher.AddHandler(nullptr, APP_EVENT_LOW_MEMORY, callback, nullptr), APP_ERROR_INVALID_PARAMETER);
+    EXPECT_EQ(dispatcher.AddHandler(nullptr, APP_EVENT_LOW_MEMORY, callback, nullptr),
+              APP_ERROR_INVALID_PARAMETER);
     ASSERT_EQ(dispatcher.AddHandler(&handler, APP_EVENT_LOW_MEMORY, callback, nullptr), APP_ERROR_NONE);
     app_event_handler_h duplicate = nullptr;
     EXPECT_EQ(dispatcher.AddHandler(&duplicate, APP_EVENT_LOW_MEMORY, callback, nullptr),

@@ -169,7 +169,8 @@ int CreateCb(widget_context_h context, bundle* content, int w, int h, void*)
     widget_app_context_set_tag(context, &drawn);
     Draw(drawn, w, h);
     evas_object_show(drawn.window);
-    widget_set_extra_info(id.c_str(), nullptr, ("Test " + id.substr(id.rfind(':') + 1)).c_str(), nullptr, nullptr);
+    widget_set_extra_info(id.c_str(), nullptr, ("Test " + id.substr(id.rfind(':') + 1)).c_str(), nullptr,
+                          nullptr);
     ecore_timer_add(0.3, LateTimerCb, strdup(id.c_str()));
     return WIDGET_ERROR_NONE;
 }
@@ -289,7 +290,8 @@ widget_class_h AppCreateCb(void*)
     widget_app_add_event_handler(&handler, APP_EVENT_REGION_FORMAT_CHANGED, RegionCb, nullptr);
     widget_app_add_event_handler(&handler, APP_EVENT_LOW_BATTERY, LowBatteryCb, nullptr);
     widget_app_add_event_handler(&handler, APP_EVENT_LOW_MEMORY, LowMemoryCb, nullptr);
-    widget_instance_lifecycle_callback_s callbacks = {CreateCb, DestroyCb, PauseCb, ResumeCb, ResizeCb, UpdateCb};
+    widget_instance_lifecycle_callback_s callbacks = {CreateCb, DestroyCb, PauseCb,
+                                                      ResumeCb, ResizeCb,  UpdateCb};
     return widget_app_class_create(callbacks, nullptr);
 }
 

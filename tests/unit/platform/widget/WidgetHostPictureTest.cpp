@@ -32,8 +32,7 @@ Picture Load(const std::string& path)
     {
         evas_object_image_size_get(image, &picture.width, &picture.height);
         auto* pixels = static_cast<const unsigned*>(evas_object_image_data_get(image, EINA_FALSE));
-        for (int i = 0; pixels && i < picture.width * picture.height; ++i)
-            picture.colours.insert(pixels[i]);
+        for (int i = 0; pixels && i < picture.width * picture.height; ++i) picture.colours.insert(pixels[i]);
     }
     ecore_evas_free(canvas);
     ecore_evas_shutdown();
@@ -84,7 +83,8 @@ TEST_F(WidgetHostTest, SnapshotToAnUnwritablePlaceIsAnError)
 {
     StartHost();
     std::string id = CreateInstance("4x2");
-    EXPECT_THAT(Send("snapshot " + id + " " + mRoot.Path("missing/dir/x.png")), HasSubstr("ERR could not write"));
+    EXPECT_THAT(Send("snapshot " + id + " " + mRoot.Path("missing/dir/x.png")),
+                HasSubstr("ERR could not write"));
     EXPECT_THAT(Send("snapshot " + id), HasSubstr("ERR usage"));
 }
 
