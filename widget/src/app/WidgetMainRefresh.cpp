@@ -30,19 +30,22 @@ uint32_t Elapsed(time_t now, time_t then)
 }
 }  // namespace
 
+// Read, changed and written in one transaction: a row the agent or the
+// weather application writes meanwhile is never undone.
 void WidgetMain::SetIsNowRefreshing(bool refreshing)
 {
     WIDGET_LOG("SetIsNowRefreshing as:%d", refreshing);
-    NSWeather::SettingDBController settingDBController;
-    NSWeather::SettingPtr settingPtr = settingDBController.Select();
+    time_t now = Now();
+    NSWeather::SettingPtr settingPtr = NSWeather::SettingDBController().SelectAndUpdate(
+        [refreshing, now](const NSWeather::SettingPtr& s)
+        {
+            if (refreshing)
+                s->SetRefreshingStartTime(now);
+            s->SetIsNowRefreshing(refreshing);
+        });
     if (!settingPtr)
         return;
-    if (refreshing)
-        settingPtr->SetRefreshingStartTime(Now());
-    settingPtr->SetIsNowRefreshing(refreshing);
     mSettingPtr = settingPtr;
-    if (settingDBController.Update(settingPtr) != NSWeather::ERR_OK)
-        WIDGET_LOG("settingDBController.Update failed");
     RequestUpdateForEachInstances(1);
 }
 
