@@ -210,8 +210,13 @@ bool RegisterSuite(const Options& options)
          {"com.quorvex.weather-m", "com.quorvex.weather-m-agent", "com.quorvex.weather-m-widget"})
     {
         auto program = options.programs.find(appId);
-        bool hasProgram = program != options.programs.end();
-        std::string conf = hasProgram ? ExecLine(program->second) : std::string();
+        std::string path = program != options.programs.end() ? program->second : std::string();
+        // Without a program named, the build's own one (<res>/<id>/bin/<id>).
+        std::string built = options.resDir + "/" + appId + "/bin/" + appId;
+        if (path.empty() && !options.resDir.empty() && access(built.c_str(), X_OK) == 0)
+            path = built;
+        bool hasProgram = !path.empty();
+        std::string conf = hasProgram ? ExecLine(path) : std::string();
         // Nothing is linked into a folder that was not registered.
         if ((hasProgram && conf.empty()) || !RegisterApp(appId, conf))
         {

@@ -1,5 +1,8 @@
 #include "WidgetMain.h"
 
+#include <widget_errno.h>
+#include <widget_service.h>
+
 #include <stdexcept>
 
 #include "DBController.h"
@@ -12,6 +15,22 @@ namespace NSWeatherWidget
 
 using NSWeather::CityPtr;
 using NSWeather::CityPtrVectorPtr;
+
+const char* const WidgetMain::kWidgetId = "com.quorvex.weather-m-widget";
+const char* const WidgetMain::kPortName = "com.quorvex.weather-m-widget.message.port.local";
+const char* const WidgetMain::kTimeZoneLinkPath = "/opt/etc/localtime";
+WidgetMain::ClockFn WidgetMain::sClock = WidgetMain::DefaultClock;
+std::string WidgetMain::sTimeZoneLinkPath = WidgetMain::kTimeZoneLinkPath;
+
+WidgetMain::~WidgetMain()
+{
+    CancelAutoRefresh();
+}
+
+time_t WidgetMain::DefaultClock()
+{
+    return time(nullptr);
+}
 
 WidgetMain* WidgetMain::GetInstance()
 {
@@ -60,6 +79,28 @@ WidgetViewControllerPtr WidgetMain::FindWidgetObject(const std::string& idString
         if (entry.first && *entry.first == idString)
             return entry.second;
     return nullptr;
+}
+
+void WidgetMain::RequestUpdateForEachInstances(int force)
+{
+    // A copy: a trigger may reach an instance that goes away meanwhile.
+    WidgetViewControllerList entries = sWidgetViewControllerList;
+    for (const auto& entry : entries)
+    {
+        if (!entry.first)
+            continue;
+        if (widget_service_trigger_update(kWidgetId, entry.first->c_str(), nullptr, force) !=
+            WIDGET_ERROR_NONE)
+            WIDGET_LOG("widget_service_trigger_update failed");
+    }
+}
+
+void WidgetMain::CancelAutoRefresh()
+{
+    if (!sAutoRefreshTimer)
+        return;
+    ecore_timer_del(sAutoRefreshTimer);
+    sAutoRefreshTimer = nullptr;
 }
 
 void WidgetMain::Unregister(const WidgetViewControllerPtr& controller)

@@ -1,5 +1,5 @@
 // The six instance callbacks of the widget class and the registry they
-// keep. Usage events and the refresh decisions join them later.
+// keep; resume runs the two refresh checks (WidgetMainRefresh.cpp).
 #include <Elementary.h>
 #include <libintl.h>
 #include <malloc.h>
@@ -8,6 +8,7 @@
 #include <widget_service.h>
 
 #include "ContentProvider.h"
+#include "QuorvexLogManager.h"
 #include "WidgetLog.h"
 #include "WidgetMain.h"
 #include "WidgetViewController.h"
@@ -20,6 +21,16 @@ namespace
 {
 const int kErrorInvalid = -22;
 const double kAppBaseScale = 2.6;
+const int kFeatureWidgetState = 2008;
+
+int AddedWidgetDetail(int type)
+{
+    if (type == WIDGET_SIZE_TYPE_4x2)
+        return 15;
+    if (type == WIDGET_SIZE_TYPE_4x4)
+        return 14;
+    return 13;
+}
 }  // namespace
 
 std::string WidgetMain::GetIdString(widget_context_h context)
@@ -59,6 +70,9 @@ int WidgetMain::CreateWidgetInstance(widget_context_h context, bundle*, int w, i
     int result = CreateOrResizeView(controller, context, type);
     if (result != WIDGET_ERROR_NONE)
         return result;
+    NSWeather::QuorvexLogManager::GetInstance()->CollectLogByFeature(
+        kFeatureWidgetState, AddedWidgetDetail(controller->GetSizeType()),
+        NSWeather::QuorvexLogManager::URI_TYPE_APP_STATUS_SURVEY, -1);
     WIDGET_LOG("WidgetMain Created");
     elm_cache_all_flush();
     malloc_trim(0);
@@ -120,6 +134,7 @@ int WidgetMain::PauseWidgetInstance(widget_context_h context, void*)
     WidgetViewControllerPtr widgetViewControllerPtr = widgetMain->FindWidgetObject(id);
     if (!widgetViewControllerPtr)
         return WIDGET_ERROR_NOT_EXIST;
+    widgetMain->CancelAutoRefresh();
     widgetViewControllerPtr->Pause();
     elm_cache_all_flush();
     malloc_trim(0);
@@ -139,7 +154,14 @@ int WidgetMain::ResumeWidgetInstance(widget_context_h context, void*)
     WIDGET_RETV_IF(!widgetViewControllerPtr, 0);
     WidgetViewDataPtr widgetViewDataPtr = widgetViewControllerPtr->GetWidgetViewData();
     WIDGET_RETV_IF(!widgetViewDataPtr, 0);
+    NSWeather::SettingPtr settingPtr = widgetMain->mSettingPtr;
+    widgetMain->RequestCurrentLocationIfNeeded();
     widgetViewControllerPtr->Resume(false);
+    if (widgetViewDataPtr->GetIsFirstCreated() == true)
+        WIDGET_LOG("[%s(): %d] (%s) [return]", __func__, __LINE__,
+                   "widgetViewDataPtr->GetIsFirstCreated() == true");
+    else
+        widgetMain->StartAutoRefreshIfNeeded(widgetViewDataPtr, settingPtr);
     widgetViewDataPtr->SetIsFirstCreated(false);
     return 0;
 }

@@ -12,6 +12,7 @@
 #include "NetworkConnection.h"
 #include "WeatherDefine.h"
 #include "Widget4x2PageData.h"
+#include "CallbackTrampoline.h"
 #include "WidgetLog.h"
 
 namespace NSWeatherWidget
@@ -65,15 +66,18 @@ std::string Widget4x2Page::GetEdjPath() const
 // content) leaves the page with nothing to draw on.
 void Widget4x2Page::BaseLayoutDelCb(void* data, Evas*, Evas_Object*, void*)
 {
-    auto* pThis = static_cast<Widget4x2Page*>(data);
-    if (!pThis)
-        return;
-    pThis->mWidgetTouchControllerPtr.reset();
-    pThis->mBaseLayout = nullptr;
-    pThis->mNoCityLayout = nullptr;
-    pThis->mCityLayout = nullptr;
-    pThis->mActivityIndicator = nullptr;
-    pThis->mRefreshButtonIcon = nullptr;
+    NSWeather::ForwardCallback<Widget4x2Page>(
+        data,
+        [](Widget4x2Page& self)
+        {
+            self.mWidgetTouchControllerPtr.reset();
+            self.mBaseLayout = nullptr;
+            self.mNoCityLayout = nullptr;
+            self.mCityLayout = nullptr;
+            self.mActivityIndicator = nullptr;
+            self.mRefreshButtonIcon = nullptr;
+        },
+        WIDGET_CALLBACK_SITE);
 }
 
 Evas_Object* Widget4x2Page::LoadLayout(Evas_Object* parent, const char* group)
@@ -262,11 +266,15 @@ Evas_Object* Widget4x2Page::CreateCityLayout()
 
 void Widget4x2Page::TodaySignalCb(void* data, Evas_Object*, const char* emission, const char*)
 {
-    auto* pThis = static_cast<Widget4x2Page*>(data);
-    WIDGET_RET_IF(pThis == NULL);
-    WIDGET_RET_IF(emission == NULL);
-    bool pressed = std::string(emission) == "sender,pressed,widgettoday";
-    pThis->EmitToday(pressed ? "receiver,pressed,widgettoday" : "receiver,unpressed,widgettoday");
+    NSWeather::ForwardCallback<Widget4x2Page>(
+        data,
+        [emission](Widget4x2Page& self)
+        {
+            WIDGET_RET_IF(emission == NULL);
+            bool pressed = std::string(emission) == "sender,pressed,widgettoday";
+            self.EmitToday(pressed ? "receiver,pressed,widgettoday" : "receiver,unpressed,widgettoday");
+        },
+        WIDGET_CALLBACK_SITE);
 }
 
 void Widget4x2Page::EmitToday(const char* signal)

@@ -7,6 +7,7 @@
 #include <cstdlib>
 
 #include "WeatherDefine.h"
+#include "CallbackTrampoline.h"
 #include "WidgetLog.h"
 
 namespace NSWeatherWidget
@@ -81,9 +82,8 @@ void WidgetTouchController::WatchMouse(Evas_Object* object)
 // A watched object died first: nothing is left to unregister on it.
 void WidgetTouchController::ObjectDelCb(void* data, Evas*, Evas_Object* obj, void*)
 {
-    auto* pThis = static_cast<WidgetTouchController*>(data);
-    if (pThis)
-        pThis->Forget(obj);
+    NSWeather::ForwardCallback<WidgetTouchController>(
+        data, [obj](WidgetTouchController& self) { self.Forget(obj); }, WIDGET_CALLBACK_SITE);
 }
 
 void WidgetTouchController::Forget(Evas_Object* object)
@@ -105,47 +105,63 @@ bool WidgetTouchController::IsTap(const WidgetTouchData& touchData, Evas_Event_F
 
 void WidgetTouchController::CPLogoClickedCb(void* data, Evas_Object*, const char*, const char*)
 {
-    auto* pThis = static_cast<WidgetTouchController*>(data);
-    WIDGET_RET_IF(pThis == NULL);
-    WIDGET_RET_IF(pThis->mWidgetTouchEventListener == NULL);
-    WIDGET_RET_IF(pThis->mWidgetTouchEventListener->RequestUrl() != NSWeather::ERR_OK);
+    NSWeather::ForwardCallback<WidgetTouchController>(
+        data,
+        [](WidgetTouchController& self)
+        {
+            WIDGET_RET_IF(self.mWidgetTouchEventListener == NULL);
+            WIDGET_RET_IF(self.mWidgetTouchEventListener->RequestUrl() != NSWeather::ERR_OK);
+        },
+        WIDGET_CALLBACK_SITE);
 }
 
 void WidgetTouchController::RefreshButtonClickedCb(void* data, Evas_Object*, const char*, const char*)
 {
-    auto* pThis = static_cast<WidgetTouchController*>(data);
-    WIDGET_RET_IF(pThis == NULL);
-    WIDGET_RET_IF(pThis->mWidgetTouchEventListener == NULL);
-    WIDGET_RET_IF(pThis->mWidgetTouchEventListener->Refresh() != NSWeather::ERR_OK);
+    NSWeather::ForwardCallback<WidgetTouchController>(
+        data,
+        [](WidgetTouchController& self)
+        {
+            WIDGET_RET_IF(self.mWidgetTouchEventListener == NULL);
+            WIDGET_RET_IF(self.mWidgetTouchEventListener->Refresh() != NSWeather::ERR_OK);
+        },
+        WIDGET_CALLBACK_SITE);
 }
 
 void WidgetTouchController::MouseDownCb(void* data, Evas*, Evas_Object*, void* eventInfo)
 {
-    auto* pThis = static_cast<WidgetTouchController*>(data);
     auto* ev = static_cast<Evas_Event_Mouse_Down*>(eventInfo);
-    WIDGET_RET_IF(pThis == NULL);
-    WIDGET_RET_IF(ev == NULL);
-    WIDGET_RET_IF(!pThis->mWidgetTouchDataPtr);
-    pThis->mWidgetTouchDataPtr->mDownX = ev->canvas.x;
-    pThis->mWidgetTouchDataPtr->mDownY = ev->canvas.y;
-    pThis->mWidgetTouchDataPtr->mDownTimestamp = ev->timestamp;
+    NSWeather::ForwardCallback<WidgetTouchController>(
+        data,
+        [ev](WidgetTouchController& self)
+        {
+            WIDGET_RET_IF(ev == NULL);
+            WIDGET_RET_IF(!self.mWidgetTouchDataPtr);
+            self.mWidgetTouchDataPtr->mDownX = ev->canvas.x;
+            self.mWidgetTouchDataPtr->mDownY = ev->canvas.y;
+            self.mWidgetTouchDataPtr->mDownTimestamp = ev->timestamp;
+        },
+        WIDGET_CALLBACK_SITE);
 }
 
 void WidgetTouchController::MouseUpCb(void* data, Evas*, Evas_Object*, void* eventInfo)
 {
-    auto* pThis = static_cast<WidgetTouchController*>(data);
     auto* ev = static_cast<Evas_Event_Mouse_Up*>(eventInfo);
-    WIDGET_RET_IF(pThis == NULL);
-    WIDGET_RET_IF(ev == NULL);
-    WIDGET_RET_IF(!pThis->mWidgetTouchDataPtr);
-    WidgetTouchData& touchData = *pThis->mWidgetTouchDataPtr;
-    touchData.mUpX = ev->canvas.x;
-    touchData.mUpY = ev->canvas.y;
-    touchData.mUpTimestamp = ev->timestamp;
-    if (!IsTap(touchData, ev->event_flags))
-        return;
-    WIDGET_RET_IF(pThis->mWidgetTouchEventListener == NULL);
-    WIDGET_RET_IF(pThis->mWidgetTouchEventListener->LaunchApp() != NSWeather::ERR_OK);
+    NSWeather::ForwardCallback<WidgetTouchController>(
+        data,
+        [ev](WidgetTouchController& self)
+        {
+            WIDGET_RET_IF(ev == NULL);
+            WIDGET_RET_IF(!self.mWidgetTouchDataPtr);
+            WidgetTouchData& touchData = *self.mWidgetTouchDataPtr;
+            touchData.mUpX = ev->canvas.x;
+            touchData.mUpY = ev->canvas.y;
+            touchData.mUpTimestamp = ev->timestamp;
+            if (!IsTap(touchData, ev->event_flags))
+                return;
+            WIDGET_RET_IF(self.mWidgetTouchEventListener == NULL);
+            WIDGET_RET_IF(self.mWidgetTouchEventListener->LaunchApp() != NSWeather::ERR_OK);
+        },
+        WIDGET_CALLBACK_SITE);
 }
 
 }  // namespace NSWeatherWidget

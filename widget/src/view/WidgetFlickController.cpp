@@ -2,6 +2,7 @@
 
 #include <cstdlib>
 
+#include "CallbackTrampoline.h"
 #include "WidgetLog.h"
 
 namespace NSWeatherWidget
@@ -66,16 +67,17 @@ void WidgetFlickController::Activate(const std::string& partName)
 
 void WidgetFlickController::TouchObjectDelCb(void* data, Evas*, Evas_Object*, void*)
 {
-    auto* pThis = static_cast<WidgetFlickController*>(data);
-    if (pThis)
-        pThis->mTouchObject = nullptr;
+    NSWeather::ForwardCallback<WidgetFlickController>(
+        data, [](WidgetFlickController& self) { self.mTouchObject = nullptr; }, WIDGET_CALLBACK_SITE);
 }
 
 void WidgetFlickController::BackgroundMouseDownCb(void* data, Evas*, Evas_Object*, void* eventInfo)
 {
-    auto* pThis = static_cast<WidgetFlickController*>(data);
-    WIDGET_RET_IF(pThis == NULL);
-    pThis->OnMouseDown(static_cast<Evas_Event_Mouse_Down*>(eventInfo));
+    NSWeather::ForwardCallback<WidgetFlickController>(
+        data,
+        [eventInfo](WidgetFlickController& self)
+        { self.OnMouseDown(static_cast<Evas_Event_Mouse_Down*>(eventInfo)); },
+        WIDGET_CALLBACK_SITE);
 }
 
 void WidgetFlickController::OnMouseDown(const Evas_Event_Mouse_Down* ev)
@@ -92,9 +94,11 @@ void WidgetFlickController::OnMouseDown(const Evas_Event_Mouse_Down* ev)
 
 void WidgetFlickController::BackgroundMouseUpCb(void* data, Evas*, Evas_Object* obj, void* eventInfo)
 {
-    auto* pThis = static_cast<WidgetFlickController*>(data);
-    WIDGET_RET_IF(pThis == NULL);
-    pThis->OnMouseUp(static_cast<Evas_Event_Mouse_Up*>(eventInfo), obj);
+    NSWeather::ForwardCallback<WidgetFlickController>(
+        data,
+        [eventInfo, obj](WidgetFlickController& self)
+        { self.OnMouseUp(static_cast<Evas_Event_Mouse_Up*>(eventInfo), obj); },
+        WIDGET_CALLBACK_SITE);
 }
 
 void WidgetFlickController::OnMouseUp(const Evas_Event_Mouse_Up* ev, Evas_Object* obj)
@@ -190,10 +194,14 @@ void WidgetFlickController::TransitionEndCb(Elm_Transit_Effect*, Elm_Transit* tr
 // is the one place that queues the rotation: exactly one per slide.
 void WidgetFlickController::TransitDeleteCb(void* data, Elm_Transit* transit)
 {
-    auto* pThis = static_cast<WidgetFlickController*>(data);
-    if (!pThis || sTransitOwner != pThis || sTransit != transit)
-        return;
-    pThis->OnTransitDeleted(transit);
+    NSWeather::ForwardCallback<WidgetFlickController>(
+        data,
+        [transit](WidgetFlickController& self)
+        {
+            if (sTransitOwner == &self && sTransit == transit)
+                self.OnTransitDeleted(transit);
+        },
+        WIDGET_CALLBACK_SITE);
 }
 
 void WidgetFlickController::OnTransitDeleted(Elm_Transit*)
@@ -212,17 +220,20 @@ void WidgetFlickController::OnTransitDeleted(Elm_Transit*)
 
 void WidgetFlickController::DisplayedCityJobCb(void* data)
 {
-    auto* pThis = static_cast<WidgetFlickController*>(data);
-    if (!pThis)
-        return;
-    pThis->mDisplayedCityJob = nullptr;
-    mIsTransiging = false;
-    if (!pThis->mWidgetFlickEventListener)
-        return;
-    if (pThis->mFlickDirection == DIRECTION_NEXT)
-        pThis->mWidgetFlickEventListener->OnDisplayedNextCity();
-    else
-        pThis->mWidgetFlickEventListener->OnDisplayedPrevCity();
+    NSWeather::ForwardCallback<WidgetFlickController>(
+        data,
+        [](WidgetFlickController& self)
+        {
+            self.mDisplayedCityJob = nullptr;
+            mIsTransiging = false;
+            if (!self.mWidgetFlickEventListener)
+                return;
+            if (self.mFlickDirection == DIRECTION_NEXT)
+                self.mWidgetFlickEventListener->OnDisplayedNextCity();
+            else
+                self.mWidgetFlickEventListener->OnDisplayedPrevCity();
+        },
+        WIDGET_CALLBACK_SITE);
 }
 
 }  // namespace NSWeatherWidget

@@ -9,6 +9,7 @@
 #include "WeatherDefine.h"
 #include "Widget4x2PageController.h"
 #include "Widget4x4PageController.h"
+#include "CallbackTrampoline.h"
 #include "WidgetLog.h"
 #include "WidgetMain.h"
 #include "WidgetSettingWriter.h"
@@ -40,12 +41,15 @@ WidgetView::~WidgetView()
 // The host may close a window on its own (a display closing it).
 void WidgetView::WindowDelCb(void* data, Evas*, Evas_Object*, void*)
 {
-    auto* pThis = static_cast<WidgetView*>(data);
-    if (!pThis)
-        return;
-    pThis->mWidgetFlickControllerPtr.reset();
-    pThis->mWin = nullptr;
-    pThis->mBaseLayout = nullptr;
+    NSWeather::ForwardCallback<WidgetView>(
+        data,
+        [](WidgetView& self)
+        {
+            self.mWidgetFlickControllerPtr.reset();
+            self.mWin = nullptr;
+            self.mBaseLayout = nullptr;
+        },
+        WIDGET_CALLBACK_SITE);
 }
 
 Evas_Object* WidgetView::LayoutOf(const WidgetPageControllerPtr& controller)

@@ -1,0 +1,293 @@
+// The weather-widget program as the platform runs it: instances, refreshes
+// through a recording agent and the message port, system changes made by
+// other processes (vconftool, msgport-send).
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+#include <sys/stat.h>
+#include <sys/wait.h>
+#include <unistd.h>
+#include <vconf.h>
+
+#include <chrono>
+#include <thread>
+
+#include "SampleCities.h"
+#include "WeatherDefine.h"
+#include "WidgetHostPages.h"
+
+namespace WeatherTest
+{
+
+using ::testing::HasSubstr;
+
+namespace
+{
+const char* const kPort = "com.quorvex.weather-m-widget.message.port.local";
+const char* const kRefreshRequest = "\"MESSAGE\":\"REQUEST_ALL_WEATHER_INFO\"";
+const char* const kCurrentLocationRequest =
+    "\"MESSAGE\":\"REQUEST_CURRENT_LOCATION_WEATHER_INFO_FOR_SIMPLE_ADD_PROCESS\"";
+
+int RunTool(std::vector<std::string> args)
+{
+    pid_t pid = fork();
+    if (pid == 0)
+    {
+        std::vector<char*> argv;
+        for (auto& arg : args) argv.push_back(const_cast<char*>(arg.c_str()));
+        argv.push_back(nullptr);
+        execv(argv[0], argv.data());
+        _exit(127);
+    }
+    int status = 0;
+    waitpid(pid, &status, 0);
+    return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+}
+}  // namespace
+
+class WidgetAppTest : public WidgetHostPagesTest
+{
+public:
+    void SetUp() override
+    {
+        WidgetHostPagesTest::SetUp();
+        mRoot.RegisterApp("com.quorvex.weather-m-agent", std::string("exec=") + LAUNCH_RECORDER_PATH + "\n");
+    }
+
+    void SetKeyByTool(const std::string& type, const std::string& key, const std::string& value)
+    {
+        ASSERT_EQ(RunTool({VCONFTOOL_PATH, "set", "-t", type, key, value}), 0) << key;
+    }
+
+    void SendToPort(const std::vector<std::string>& pairs)
+    {
+        std::vector<std::string> args = {MSGPORT_SEND_PATH, kWidgetId, kPort};
+        args.insert(args.end(), pairs.begin(), pairs.end());
+        ASSERT_EQ(RunTool(args), 0);
+    }
+
+    // Another process's change reaches the widget through the main loop:
+    // wait for its trace in the widget's log, then for the widget to settle.
+    void WaitForLog(const std::string& text, int count)
+    {
+        for (int i = 0; i < 500 && CountLog(text) < count; ++i)
+            std::this_thread::sleep_for(std::chrono::milliseconds(20));
+        EXPECT_GE(CountLog(text), count) << text;
+        WaitIdle();
+    }
+
+    int CountLaunches(const std::string& part) const
+    {
+        int count = 0;
+        for (const std::string& line : Launches()) count += line.find(part) != std::string::npos;
+        return count;
+    }
+
+    void Refreshing(bool refreshing)
+    {
+        ChangeSetting(
+            [&](const NSWeather::SettingPtr& s)
+            {
+                s->SetIsNowRefreshing(refreshing);
+                s->SetRefreshingStartTime(time(nullptr));
+            });
+    }
+};
+
+TEST_F(WidgetAppTest, InstancesLiveAndDieOnTheirOwn)
+{
+    WriteCities(3);
+    StartHost({"4x2", "4x4"});
+    EXPECT_THAT(Send("list"), HasSubstr("OK 2"));
+    EXPECT_EQ(Send("destroy " + Id(1)), "OK");
+    EXPECT_THAT(Send("list"), HasSubstr("OK 1"));
+    EXPECT_NE(CentreText(Id(2), "name"), "");
+    EXPECT_THAT(Send("pause " + Id(1)), HasSubstr("ERR"));
+    // To the other size type and back: the pages stay drawn.
+    for (const char* size : {"4x2", "4x2", "4x4"})
+    {
+        EXPECT_EQ(Send("resize " + Id(2) + " " + size), "OK");
+        EXPECT_NE(CentreText(Id(2), "name"), "") << size;
+    }
+}
+
+TEST_F(WidgetAppTest, StaleDataStartsOneRefreshAfterASecondUnlessAPauseComesFirst)
+{
+    ASSERT_EQ(NSWeatherWidget::SampleCities::WriteCities(2, time(nullptr) - 7200, 7, false),
+              NSWeather::ERR_OK);
+    ChangeSetting([](const NSWeather::SettingPtr& s) { s->SetAutoRefreshInterval(1); });
+    StartHost({"4x2"});
+    EXPECT_EQ(CountLaunches(kRefreshRequest), 0) << "the first resume never refreshes";
+
+    ASSERT_EQ(Send("pause " + Id(1)), "OK");
+    ASSERT_EQ(Send("resume " + Id(1)), "OK");
+    ASSERT_EQ(Send("pause " + Id(1)), "OK");
+    WaitIdle();
+    EXPECT_EQ(CountLaunches(kRefreshRequest), 0) << "a pause cancels the pending refresh";
+
+    ASSERT_EQ(Send("resume " + Id(1)), "OK");
+    WaitIdle();
+    std::vector<std::string> launches = Launches();
+    ASSERT_EQ(launches.size(), 1u);
+    EXPECT_THAT(launches[0], HasSubstr("\"app_id\":\"com.quorvex.weather-m-agent\""));
+    EXPECT_THAT(launches[0], HasSubstr(kRefreshRequest));
+    EXPECT_TRUE(ReadSetting()->GetIsNowRefreshing());
+}
+
+// The mark is set behind the widget's back: a shown progress indicator
+// would keep the canvas drawing and the host never idle.
+class WidgetNetworkTest : public WidgetAppTest, public ::testing::WithParamInterface<bool>
+{
+};
+
+TEST_P(WidgetNetworkTest, LossClearsTheMarkAndTheReturnAsksForAMissingCurrentLocationCity)
+{
+    bool hasCurrentLocationCity = GetParam();
+    WriteCities(2, 7, hasCurrentLocationCity);
+    ChangeSetting(
+        [](const NSWeather::SettingPtr& s)
+        {
+            s->SetUseCurrentLocationOn(true);
+            s->SetShowCurrentCityAgreement(true);
+        });
+    // Location off at start, so the first resume does not ask already.
+    SetKey("db/location/setting/Usemylocation", 0);
+    StartHost({"4x2"});
+    SetKey("db/location/setting/Usemylocation", 1);
+    int requests = CountLaunches(kCurrentLocationRequest);
+    EXPECT_EQ(requests, 0);
+    Refreshing(true);
+    SetKeyByTool("int", "memory/dnet/status", "0");
+    WaitForLog("OnNetworkConnectionStateChanged state:0", 1);
+    EXPECT_FALSE(ReadSetting()->GetIsNowRefreshing());
+    SetKeyByTool("int", "memory/dnet/status", "1");
+    int expected = requests + (hasCurrentLocationCity ? 0 : 1);
+    for (int i = 0; i < 500 && CountLog("OnNetworkConnectionStateChanged state:1") < 1; ++i)
+        std::this_thread::sleep_for(std::chrono::milliseconds(20));
+    EXPECT_EQ(CountLaunches(kCurrentLocationRequest), expected);
+    EXPECT_EQ(CountLaunches(std::string("\"PORT_ID\":\"") + kPort + "\""), expected);
+    EXPECT_EQ(ReadSetting()->GetIsNowRefreshing(), !hasCurrentLocationCity);
+}
+
+INSTANTIATE_TEST_SUITE_P(CurrentLocationCity, WidgetNetworkTest, ::testing::Bool());
+
+TEST_F(WidgetAppTest, EverySystemChangeRedrawsEveryInstance)
+{
+    struct Case
+    {
+        const char* name;
+        std::function<void(WidgetAppTest&)> change;
+    };
+    const Case cases[] = {
+        {"Language",
+         [](WidgetAppTest& t) { t.SetKeyByTool("string", "db/menu_widget/language", "ko_KR.UTF-8"); }},
+        {"LanguageUnset",
+         [](WidgetAppTest& t)
+         {
+             ASSERT_EQ(vconf_set_str("db/menu_widget/language", ""), 0);
+             EXPECT_EQ(t.Send("event language"), "OK");
+         }},
+        {"RegionFormat", [](WidgetAppTest& t) { EXPECT_EQ(t.Send("event region"), "OK"); }},
+        {"SystemTime", [](WidgetAppTest& t) { t.SetKeyByTool("int", "memory/system/timechanged", "1"); }},
+        {"TimeZone",
+         [](WidgetAppTest& t) { t.SetKeyByTool("string", "db/setting/timezone_id", "Asia/Tokyo"); }},
+        {"DateFormat", [](WidgetAppTest& t) { t.SetKeyByTool("int", "db/setting/date_format", "2"); }},
+        {"Clock1224",
+         [](WidgetAppTest& t) { t.SetKeyByTool("int", "db/menu_widget/regionformat_time1224", "2"); }},
+        {"ColourTheme", [](WidgetAppTest& t) { t.SetKeyByTool("int", "db/setting/change_ui/theme", "1"); }},
+        {"FontTheme",
+         [](WidgetAppTest& t) { t.SetKeyByTool("int", "db/setting/accessibility/font_size", "3"); }},
+    };
+    WriteCities(3);
+    SetKey("db/menu_widget/regionformat_time1224", 1);
+    StartHost({"4x2", "4x4"});
+    for (const Case& c : cases)
+    {
+        SCOPED_TRACE(c.name);
+        int before = CountLog("UpdateWidgetInstance");
+        c.change(*this);
+        WaitForLog("UpdateWidgetInstance", before + 2);
+    }
+}
+
+TEST_F(WidgetAppTest, ClockFormatChangesTheTimeTextWithoutNewData)
+{
+    struct Case
+    {
+        const char* type;
+        const char* key;
+        const char* value;
+    };
+    const Case cases[] = {{"int", "db/menu_widget/regionformat_time1224", "2"},
+                          {"int", "db/menu_widget/regionformat_time1224", "1"}};
+    WriteCities(1);
+    SetKey("db/menu_widget/regionformat_time1224", 1);
+    StartHost({"4x2"});
+    for (const Case& c : cases)
+    {
+        SCOPED_TRACE(c.key);
+        std::string before = CentreText(Id(1), "time");
+        int updates = CountLog("UpdateWidgetInstance");
+        SetKeyByTool(c.type, c.key, c.value);
+        WaitForLog("UpdateWidgetInstance", updates + 1);
+        EXPECT_NE(CentreText(Id(1), "time"), before);
+    }
+}
+
+TEST_F(WidgetAppTest, LowBatteryEndsTheProcess)
+{
+    WriteCities(1);
+    StartHost({"4x2", "4x4"});
+    SetKeyByTool("int", "memory/sysman/battery_status_low", "1");
+    int status = -1;
+    for (int i = 0; i < 500 && waitpid(mHostPid, &status, WNOHANG) == 0; ++i)
+        std::this_thread::sleep_for(std::chrono::milliseconds(20));
+    EXPECT_TRUE(WIFEXITED(status));
+    mHostPid = -1;
+}
+
+TEST_F(WidgetAppTest, AnyPortMessageEndsTheRefreshAndRedrawsWithTheNewData)
+{
+    struct Case
+    {
+        const char* name;
+        std::vector<std::string> sizes;
+        std::vector<std::string> message;
+    };
+    const Case cases[] = {{"WithContent", {"4x2", "4x4"}, {"RESULT=OK"}},
+                          {"Empty", {"4x2", "4x4"}, {}},
+                          {"NoInstance", {}, {}}};
+    for (const Case& c : cases)
+    {
+        SCOPED_TRACE(c.name);
+        WriteCities(1);
+        StartHost(c.sizes);
+        // What the agent writes before it posts.
+        Refreshing(true);
+        WriteCities(3);
+        ChangeSetting([](const NSWeather::SettingPtr& s) { s->SetLastRefreshedTime(time(nullptr) + 5); });
+        SendToPort(c.message);
+        for (int i = 0; i < 500 && ReadSetting()->GetIsNowRefreshing(); ++i)
+            std::this_thread::sleep_for(std::chrono::milliseconds(20));
+        EXPECT_FALSE(ReadSetting()->GetIsNowRefreshing());
+        WaitIdle();
+        for (size_t n = 1; n <= c.sizes.size(); ++n)
+            EXPECT_THAT(Slot(Id(static_cast<int>(n)), "nextLayout"), HasSubstr("\"name\":")) << n;
+        TearDown();
+        mHostPid = -1;
+        mClient.Disconnect();
+    }
+}
+
+TEST_F(WidgetAppTest, StartUpOnAnEmptyRootCreatesTheDatabasesAndShowsNoCity)
+{
+    for (const char* file : {".weather.db", ".setting.db", ".share_target.db", ".version.db"})
+        unlink((mRoot.SharedDataDir() + "/db/" + file).c_str());
+    StartHost({"4x2"});
+    struct stat st;
+    for (const char* file : {".weather.db", ".setting.db", ".share_target.db", ".version.db"})
+        EXPECT_EQ(stat((mRoot.SharedDataDir() + "/db/" + file).c_str(), &st), 0) << file;
+    ASSERT_TRUE(ReadSetting());
+    EXPECT_THAT(Slot(Id(1), "centerLayout"), HasSubstr("\"group\":\"noCity\""));
+}
+
+}  // namespace WeatherTest
