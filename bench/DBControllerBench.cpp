@@ -64,12 +64,10 @@ void FillCities(int count)
     DBController db;
     db.Initialize();
     CityPtrVectorPtr cities = std::make_shared<CityPtrVector>();
-    for (int n = 0; n < count; ++n)
-        cities->push_back(MakeCity(n));
+    for (int n = 0; n < count; ++n) cities->push_back(MakeCity(n));
     db.DeleteAllCityDataAndInsertCityPtrVector(cities);
     db.DeleteUselessMoonPhaseData();
-    for (const CityPtr& city : *cities)
-        db.UpdateOnlyMoonPhaseData(city);
+    for (const CityPtr& city : *cities) db.UpdateOnlyMoonPhaseData(city);
 }
 
 void BM_SelectAllCityData(benchmark::State& state)

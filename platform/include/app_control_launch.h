@@ -4,7 +4,8 @@
 #include "app_control.h"
 
 #ifdef __cplusplus
-extern "C" {
+extern "C"
+{
 #endif
 
 /* Our extension: the launcher hands the request to the started program in
@@ -18,10 +19,10 @@ extern "C" {
 #define APP_CONTROL_LOCATION_SETTING_APP_ID "org.tizen.setting-location"
 #define APP_CONTROL_BROWSER_APP_ID "org.tizen.browser"
 
-/* The request this process was started with, as a new handle that the
- * caller destroys. KEY_NOT_FOUND when the process was not started by a
- * launch request, INVALID_PARAMETER when the request is malformed. */
-int app_control_get_launch_request(app_control_h *app_control);
+    /* The request this process was started with, as a new handle that the
+     * caller destroys. KEY_NOT_FOUND when the process was not started by a
+     * launch request, INVALID_PARAMETER when the request is malformed. */
+    int app_control_get_launch_request(app_control_h* app_control);
 
 #ifdef __cplusplus
 }

@@ -6,11 +6,12 @@
 #include "widget_app.h"
 
 #ifdef __cplusplus
-extern "C" {
+extern "C"
+{
 #endif
 
-/* The instance's window, made on first call; owned by the instance. */
-int widget_app_get_elm_win(widget_context_h context, Evas_Object **win);
+    /* The instance's window, made on first call; owned by the instance. */
+    int widget_app_get_elm_win(widget_context_h context, Evas_Object** win);
 
 #ifdef __cplusplus
 }

@@ -11,12 +11,14 @@ namespace WeatherTest
 // Runs the Ecore main loop until `done` holds or `timeoutSeconds` pass.
 inline bool RunLoopUntil(const std::function<bool()>& done, double timeoutSeconds)
 {
-    auto poll = [](void* data) -> Eina_Bool {
+    auto poll = [](void* data) -> Eina_Bool
+    {
         if ((*static_cast<const std::function<bool()>*>(data))())
             ecore_main_loop_quit();
         return ECORE_CALLBACK_RENEW;
     };
-    auto quit = [](void* data) -> Eina_Bool {
+    auto quit = [](void* data) -> Eina_Bool
+    {
         *static_cast<Ecore_Timer**>(data) = nullptr;
         ecore_main_loop_quit();
         return ECORE_CALLBACK_CANCEL;

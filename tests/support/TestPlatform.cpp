@@ -17,7 +17,7 @@ const char* const kSuiteApps[] = {"com.quorvex.weather-m", "com.quorvex.weather-
 
 void MakeDirs(const std::string& path)
 {
-    for (size_t pos = path.find('/', 1); ; pos = path.find('/', pos + 1))
+    for (size_t pos = path.find('/', 1);; pos = path.find('/', pos + 1))
     {
         mkdir(path.substr(0, pos).c_str(), 0755);
         if (pos == std::string::npos)
@@ -47,8 +47,7 @@ TestPlatformRoot::TestPlatformRoot()
         mOldRoot = old;
     }
     setenv("PLATFORM_ROOT", mPath.c_str(), 1);
-    for (const char* app : kSuiteApps)
-        RegisterApp(app);
+    for (const char* app : kSuiteApps) RegisterApp(app);
 }
 
 TestPlatformRoot::~TestPlatformRoot()
@@ -58,11 +57,15 @@ TestPlatformRoot::~TestPlatformRoot()
     else
         unsetenv("PLATFORM_ROOT");
     // Fix permissions top-down first so that nftw can enter every folder.
-    nftw(mPath.c_str(), [](const char* p, const struct stat* st, int, struct FTW*) {
-        if (S_ISDIR(st->st_mode))
-            chmod(p, 0700);
-        return 0;
-    }, 16, FTW_PHYS);
+    nftw(
+        mPath.c_str(),
+        [](const char* p, const struct stat* st, int, struct FTW*)
+        {
+            if (S_ISDIR(st->st_mode))
+                chmod(p, 0700);
+            return 0;
+        },
+        16, FTW_PHYS);
     nftw(mPath.c_str(), RemoveEntry, 16, FTW_DEPTH | FTW_PHYS);
 }
 
@@ -146,8 +149,7 @@ std::string LogCapture::Dump() const
 {
     std::lock_guard<std::mutex> lock(mMutex);
     std::string all;
-    for (const LogLine& line : mLines)
-        all += line.tag + ": " + line.text + "\n";
+    for (const LogLine& line : mLines) all += line.tag + ": " + line.text + "\n";
     return all;
 }
 

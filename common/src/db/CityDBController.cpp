@@ -260,7 +260,8 @@ bool CityDBController::SetPageIndexAsAscending()
     // cursor.
     std::vector<int> keys;
     {
-        DBStatement select(std::string("SELECT PK_ID FROM ") + TABLE_NAME + " ORDER BY pageIndex ASC, PK_ID ASC;");
+        DBStatement select(std::string("SELECT PK_ID FROM ") + TABLE_NAME +
+                           " ORDER BY pageIndex ASC, PK_ID ASC;");
         while (select.Step() == SQLITE_ROW) keys.push_back(select.ColumnInt(0));
     }
     DBStatement update(std::string("UPDATE ") + TABLE_NAME + " SET pageIndex=? WHERE PK_ID=?;");

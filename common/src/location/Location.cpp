@@ -5,9 +5,7 @@
 namespace NSWeather
 {
 
-Location::Location() : mHandler(nullptr)
-{
-}
+Location::Location() : mHandler(nullptr) {}
 
 Location::~Location()
 {

@@ -341,16 +341,14 @@ void City::PrintForecastWeatherInfo() const
 {
     size_t count = mWeeklyPtrVector ? mWeeklyPtrVector->size() : 0;
     COMMON_LOG("===== forecast weather info (pageIndex : %d, count : %zu) =====", mPageIndex, count);
-    for (size_t i = 0; i < count; ++i)
-        LogWeekly(i, (*mWeeklyPtrVector)[i]);
+    for (size_t i = 0; i < count; ++i) LogWeekly(i, (*mWeeklyPtrVector)[i]);
 }
 
 void City::PrintHourlyWeatherInfo() const
 {
     size_t count = mHourlyPtrVector ? mHourlyPtrVector->size() : 0;
     COMMON_LOG("===== hourly weather info (pageIndex : %d, count : %zu) =====", mPageIndex, count);
-    for (size_t i = 0; i < count; ++i)
-        LogHourly(i, (*mHourlyPtrVector)[i]);
+    for (size_t i = 0; i < count; ++i) LogHourly(i, (*mHourlyPtrVector)[i]);
 }
 
 void City::PrintExtraWeatherInfo() const

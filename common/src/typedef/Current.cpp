@@ -3,11 +3,7 @@
 namespace NSWeather
 {
 
-Current::Current()
-    : Weather(),
-      mWebsiteUrl("NULL")
-{
-}
+Current::Current() : Weather(), mWebsiteUrl("NULL") {}
 
 Current::~Current() = default;
 

@@ -3,12 +3,7 @@
 namespace NSWeather
 {
 
-Hourly::Hourly()
-    : Weather(),
-      mHour(999),
-      mWebsiteUrl("NULL")
-{
-}
+Hourly::Hourly() : Weather(), mHour(999), mWebsiteUrl("NULL") {}
 
 Hourly::~Hourly() = default;
 

@@ -4,12 +4,7 @@ namespace NSWeather
 {
 
 MoonPhase::MoonPhase()
-    : mLocationID(),
-      mDate(999),
-      mMoonRiseTime(999),
-      mMoonSetTime(999),
-      mPhaseText(),
-      mAge(999)
+    : mLocationID(), mDate(999), mMoonRiseTime(999), mMoonSetTime(999), mPhaseText(), mAge(999)
 {
 }
 

@@ -3,11 +3,7 @@
 namespace NSWeather
 {
 
-ShareTarget::ShareTarget()
-    : mAppID(),
-      mPortID()
-{
-}
+ShareTarget::ShareTarget() : mAppID(), mPortID() {}
 
 ShareTarget::~ShareTarget() = default;
 

@@ -15,9 +15,7 @@ double RoundToOneDecimal(double value)
 }
 }  // namespace
 
-Temperature::Temperature() : mCelsius(NO_TEMPERATURE), mFahrenheit(NO_TEMPERATURE)
-{
-}
+Temperature::Temperature() : mCelsius(NO_TEMPERATURE), mFahrenheit(NO_TEMPERATURE) {}
 
 Temperature::~Temperature() = default;
 

@@ -3,12 +3,7 @@
 namespace NSWeather
 {
 
-Weekly::Weekly()
-    : Weather(),
-      mWebsiteUrl("NULL"),
-      mDayOfWeek(0)
-{
-}
+Weekly::Weekly() : Weather(), mWebsiteUrl("NULL"), mDayOfWeek(0) {}
 
 Weekly::~Weekly() = default;
 

@@ -47,12 +47,13 @@ bool TimeUtil::GetIsDay(const CityPtr& cityPtr, time_t t)
 std::string TimeUtil::GetLocalTimeStringLong(const CityPtr& cityPtr, int contentProvider)
 {
     COMMON_RETV_IF(!cityPtr, std::string());
-    time_t shifted = GetCurrentTime() + static_cast<time_t>(cityPtr->GetGmtOffset() * 3600.0) -
-                     ICUUtil::GetTmGmtOff();
+    time_t shifted =
+        GetCurrentTime() + static_cast<time_t>(cityPtr->GetGmtOffset() * 3600.0) - ICUUtil::GetTmGmtOff();
     if (contentProvider != CP_ACCUWEATHER && cityPtr->GetIsSummerTime())
         shifted += 3600;
-    int index = VconfUtil::GetRegionFormatTime1224() == VCONFKEY_TIME_FORMAT_12 ? ICUUtil::SKELETON_EEEdMMM_hhmm
-                                                                                : ICUUtil::SKELETON_EEEdMMM_HHmm;
+    int index = VconfUtil::GetRegionFormatTime1224() == VCONFKEY_TIME_FORMAT_12
+                    ? ICUUtil::SKELETON_EEEdMMM_hhmm
+                    : ICUUtil::SKELETON_EEEdMMM_HHmm;
     return ICUUtil::GetDateTimeString(shifted, index);
 }
 
