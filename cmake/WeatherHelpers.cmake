@@ -2,12 +2,6 @@
 
 set(WEATHER_WARNINGS -Wall -Wextra)
 
-function(weather_add_subdirectory_if_exists dir)
-  if(EXISTS ${CMAKE_CURRENT_SOURCE_DIR}/${dir}/CMakeLists.txt)
-    add_subdirectory(${dir})
-  endif()
-endfunction()
-
 # Adds every direct subfolder of `dir` that has a CMakeLists.txt, so that
 # each area of a component owns its own list of sources.
 function(weather_add_area_subdirectories dir)

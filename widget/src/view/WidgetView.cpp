@@ -361,58 +361,38 @@ NSWeather::SettingPtr WidgetView::ShowCity(int index)
 
 void WidgetView::OnDisplayedNextCity()
 {
-    if (!mWidgetViewDataPtr)
-    {
-        WIDGET_LOG_BREAK("!mWidgetViewDataPtr");
+    if (ShowNeighbourCity(true) != NSWeather::ERR_OK)
         WIDGET_LOG("Failed: OnDisplayedNextCity [%d]", -1);
-        return;
-    }
-    int cur = mWidgetViewDataPtr->GetIndexOfDisplayCity();
-    int nxt = mWidgetViewDataPtr->GetNextCityIndex();
-    if (cur == nxt)
-        return;
-    NSWeather::SettingPtr settingPtr = ShowCity(nxt < 0 ? cur : nxt);
-    RotateSlots(true);
-    for (auto* controller : {&mPrevPageControllerPtr, &mCenterPageControllerPtr})
-        if (*controller && settingPtr)
-            (*controller)->SetSettingPtr(settingPtr);
-    mNextPageControllerPtr.reset();
-    mNextPageControllerPtr = CreatePage(mBaseLayout, mWidgetViewDataPtr->GetNextCityIndex());
-    if (!mNextPageControllerPtr)
-    {
-        WIDGET_LOG_BREAK("!mNextPageControllerPtr");
-        WIDGET_LOG("Failed: OnDisplayedNextCity [%d]", -1);
-        return;
-    }
-    PutPage(mNextPageControllerPtr, kNextSlot);
 }
 
 void WidgetView::OnDisplayedPrevCity()
 {
-    if (!mWidgetViewDataPtr)
-    {
-        WIDGET_LOG_BREAK("!mWidgetViewDataPtr");
+    if (ShowNeighbourCity(false) != NSWeather::ERR_OK)
         WIDGET_LOG("Failed: OnDisplayedPrevCity [%d]", -1);
-        return;
-    }
+}
+
+// The end of a slide: the neighbour on the slide's side becomes the centre,
+// and the slot it left gets the page of the city beyond it.
+int WidgetView::ShowNeighbourCity(bool toNext)
+{
+    WIDGET_RETV_IF(!mWidgetViewDataPtr, -1);
     int cur = mWidgetViewDataPtr->GetIndexOfDisplayCity();
-    int prv = mWidgetViewDataPtr->GetPrevCityIndex();
-    if (cur == prv)
-        return;
-    NSWeather::SettingPtr settingPtr = ShowCity(prv < 0 ? cur : prv);
-    RotateSlots(false);
-    for (auto* controller : {&mNextPageControllerPtr, &mCenterPageControllerPtr})
+    int neighbour = toNext ? mWidgetViewDataPtr->GetNextCityIndex() : mWidgetViewDataPtr->GetPrevCityIndex();
+    if (cur == neighbour)
+        return NSWeather::ERR_OK;
+    NSWeather::SettingPtr settingPtr = ShowCity(neighbour < 0 ? cur : neighbour);
+    RotateSlots(toNext);
+    WidgetPageControllerPtr& refilled = toNext ? mNextPageControllerPtr : mPrevPageControllerPtr;
+    WidgetPageControllerPtr& kept = toNext ? mPrevPageControllerPtr : mNextPageControllerPtr;
+    for (WidgetPageControllerPtr* controller : {&kept, &mCenterPageControllerPtr})
         if (*controller && settingPtr)
             (*controller)->SetSettingPtr(settingPtr);
-    mPrevPageControllerPtr.reset();
-    mPrevPageControllerPtr = CreatePage(mBaseLayout, mWidgetViewDataPtr->GetPrevCityIndex());
-    if (!mPrevPageControllerPtr)
-    {
-        WIDGET_LOG_BREAK("!mPrevPageControllerPtr");
-        WIDGET_LOG("Failed: OnDisplayedPrevCity [%d]", -1);
-        return;
-    }
-    PutPage(mPrevPageControllerPtr, kPrevSlot);
+    refilled.reset();
+    refilled = CreatePage(mBaseLayout, toNext ? mWidgetViewDataPtr->GetNextCityIndex()
+                                              : mWidgetViewDataPtr->GetPrevCityIndex());
+    WIDGET_RETV_IF(!refilled, -1);
+    PutPage(refilled, toNext ? kNextSlot : kPrevSlot);
+    return NSWeather::ERR_OK;
 }
 
 // The incoming page becomes the centre, the centre the outgoing side's

@@ -64,6 +64,7 @@ private:
     void ResumeNeighbour(WidgetPageControllerPtr& controller, const char* slot, int index);
     NSWeather::SettingPtr ShowCity(int index);
     void RotateSlots(bool toNext);
+    int ShowNeighbourCity(bool toNext);
     static Evas_Object* LayoutOf(const WidgetPageControllerPtr& controller);
     static void WindowDelCb(void* data, Evas* evas, Evas_Object* obj, void* eventInfo);
 
