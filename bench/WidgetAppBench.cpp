@@ -23,6 +23,7 @@
 #include "DataStoreInitializer.h"
 #include "FileUtil.h"
 #include "SampleCities.h"
+#include "WidgetBenchRoot.h"
 #include "widget/ControlClient.h"
 
 namespace
@@ -33,20 +34,9 @@ std::string gRoot;
 
 void MakeRoot()
 {
-    std::string pattern = "/tmp/weather-app-bench-XXXXXX";
-    gRoot = mkdtemp(&pattern[0]);
-    setenv("PLATFORM_ROOT", gRoot.c_str(), 1);
-    setenv("PLATFORM_APP_ID", "bench", 1);
+    gRoot = MakeWidgetBenchRoot("bench");
     unsetenv("DISPLAY");
     unsetenv("WAYLAND_DISPLAY");
-    std::string widgetDir = gRoot + "/apps/" + kWidgetId;
-    std::string command = "mkdir -p '" + widgetDir + "' '" + gRoot +
-                          "/apps/com.quorvex.weather-m/shared/data' && ln -s '" WEATHER_BENCH_RES_DIR "' '" +
-                          widgetDir + "/res'";
-    if (system(command.c_str()) != 0)
-        abort();
-    NSWeather::FileUtil::ClearCache();
-    vconf_set_int("memory/dnet/status", 2);
     vconf_set_str("db/menu_widget/language", "en_US.UTF-8");
     if (NSWeather::DataStoreInitializer::Run() != 0 ||
         NSWeatherWidget::SampleCities::WriteCities(10, time(nullptr), 7, false) != 0)
@@ -240,6 +230,7 @@ int main(int argc, char** argv)
     benchmark::Initialize(&argc, argv);
     benchmark::RunSpecifiedBenchmarks();
     benchmark::Shutdown();
-    std::string command = "rm -rf '" + gRoot + "'";
-    return system(command.c_str()) == 0 ? 0 : 1;
+    std::error_code error;
+    std::filesystem::remove_all(gRoot, error);
+    return error ? 1 : 0;
 }

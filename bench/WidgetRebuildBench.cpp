@@ -18,6 +18,7 @@
 #include "Widget4x2PageController.h"
 #include "Widget4x4PageController.h"
 #include "Widget4x4PageData.h"
+#include "WidgetBenchRoot.h"
 #include "WidgetMain.h"
 
 using namespace NSWeatherWidget;
@@ -30,18 +31,7 @@ const char* const kWidgetId = "com.quorvex.weather-m-widget";
 // a connected network.
 void MakeRoot()
 {
-    std::string pattern = "/tmp/weather-bench-XXXXXX";
-    std::string root = mkdtemp(&pattern[0]);
-    setenv("PLATFORM_ROOT", root.c_str(), 1);
-    setenv("PLATFORM_APP_ID", kWidgetId, 1);
-    std::string widgetDir = root + "/apps/" + kWidgetId;
-    std::string command = "mkdir -p '" + widgetDir + "' '" + root +
-                          "/apps/com.quorvex.weather-m/shared/data' && ln -s '" WEATHER_BENCH_RES_DIR "' '" +
-                          widgetDir + "/res'";
-    if (system(command.c_str()) != 0)
-        abort();
-    NSWeather::FileUtil::ClearCache();
-    vconf_set_int("memory/dnet/status", 2);
+    MakeWidgetBenchRoot(kWidgetId);
     vconf_set_int("db/location/setting/Usemylocation", 1);
     if (NSWeather::DataStoreInitializer::Run() != 0 ||
         SampleCities::WriteCities(3, time(nullptr), 7, false) != 0)
