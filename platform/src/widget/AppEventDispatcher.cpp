@@ -7,6 +7,8 @@
 #include <cstdlib>
 #include <cstring>
 #include <locale.h>
+#include <sys/stat.h>
+#include <time.h>
 
 #include "core/ApiGuard.h"
 #include "dlog.h"
@@ -17,6 +19,7 @@ namespace platform
 namespace
 {
 const char* const kLogTag = "widget-host";
+const char* const kZoneInfoDir = "/usr/share/zoneinfo/";
 
 struct KeyWatch
 {
@@ -225,6 +228,34 @@ bool AppEventDispatcher::ApplyRegionFormat(const std::string& locale)
     return true;
 }
 
+bool AppEventDispatcher::ApplyTimeZone(const std::string& zoneId)
+{
+    static const size_t kMaxZoneId = 64;
+    bool usable =
+        !zoneId.empty() && zoneId.size() <= kMaxZoneId && zoneId[0] != '/' &&
+        zoneId.find("..") == std::string::npos &&
+        zoneId.find_first_not_of("ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789/_+-") ==
+            std::string::npos;
+    struct stat st;
+    if (!usable || stat((std::string(kZoneInfoDir) + zoneId).c_str(), &st) != 0 || !S_ISREG(st.st_mode))
+    {
+        dlog_print(DLOG_ERROR, kLogTag, "time zone \"%.64s\" is not a known zone; local time unchanged",
+                   zoneId.c_str());
+        return false;
+    }
+    setenv("TZ", (":" + zoneId).c_str(), 1);
+    tzset();
+    return true;
+}
+
+void AppEventDispatcher::FollowTimeZone(bool on)
+{
+    if (on)
+        vconf_notify_key_changed(VCONFKEY_SETAPPL_TIMEZONE_ID, TimeZoneKeyCb, this);
+    else
+        vconf_ignore_key_changed(VCONFKEY_SETAPPL_TIMEZONE_ID, TimeZoneKeyCb);
+}
+
 void AppEventDispatcher::ApplyStartupKeys()
 {
     std::string language = ReadString(VCONFKEY_LANGSET);
@@ -241,6 +272,9 @@ void AppEventDispatcher::ApplyStartupKeys()
             setenv("LC_TIME", region.c_str(), 1);
         }
     }
+    std::string zone = ReadString(VCONFKEY_SETAPPL_TIMEZONE_ID);
+    if (!zone.empty())
+        ApplyTimeZone(zone);
 }
 
 void AppEventDispatcher::LanguageKeyCb(keynode_t* node, void* data)
@@ -269,6 +303,12 @@ void AppEventDispatcher::MemoryKeyCb(keynode_t* node, void* data)
     NSWeather::ForwardCallback<AppEventDispatcher>(
         data, [node](AppEventDispatcher& self) { self.OnMemory(node ? vconf_keynode_get_int(node) : -1); },
         PLATFORM_CALLBACK_SITE(kLogTag));
+}
+
+void AppEventDispatcher::TimeZoneKeyCb(keynode_t* node, void* data)
+{
+    NSWeather::ForwardCallback<AppEventDispatcher>(
+        data, [node](AppEventDispatcher&) { ApplyTimeZone(TextOf(node)); }, PLATFORM_CALLBACK_SITE(kLogTag));
 }
 
 }  // namespace platform

@@ -50,6 +50,13 @@ public:
     static void ApplyLanguage(const std::string& locale);
     // False (and LC_TIME unchanged) when the locale is not installed.
     static bool ApplyRegionFormat(const std::string& locale);
+    // Points the process's local time (TZ) at an IANA zone id; false, and
+    // TZ unchanged, for a text that is not one.
+    static bool ApplyTimeZone(const std::string& zoneId);
+    // While on, the process's local time follows the time-zone key; the
+    // watch comes before the application's own, so its listeners see the
+    // new zone.
+    void FollowTimeZone(bool on);
 
 private:
     // One callback an event type; its user data does not tell two apart.
@@ -75,6 +82,7 @@ private:
     static void RegionKeyCb(keynode_t* node, void* data);
     static void BatteryKeyCb(keynode_t* node, void* data);
     static void MemoryKeyCb(keynode_t* node, void* data);
+    static void TimeZoneKeyCb(keynode_t* node, void* data);
 
     // The handles given out; the listeners of each type are called.
     std::vector<std::unique_ptr<app_event_handler>> mHandlers;

@@ -72,6 +72,7 @@ int WidgetHost::Run(int argc, char** argv, widget_app_lifecycle_callback_s* call
     mIsExitRequested = false;
     if (!StartApplication(callback, userData))
     {
+        AppEventDispatcher::GetInstance().FollowTimeZone(false);
         mIsRunning = false;
         elm_shutdown();
         return WIDGET_ERROR_FAULT;
@@ -139,6 +140,7 @@ bool WidgetHost::StartApplication(widget_app_lifecycle_callback_s* callback, voi
 {
     mAppCallbacks = *callback;
     mAppUserData = userData;
+    AppEventDispatcher::GetInstance().FollowTimeZone(true);
     widget_class_h widgetClass = mAppCallbacks.create(mAppUserData);
     if (!widgetClass)
     {
@@ -160,6 +162,7 @@ void WidgetHost::CreateStartupInstances()
 
 void WidgetHost::StopApplication()
 {
+    AppEventDispatcher::GetInstance().FollowTimeZone(false);
     if (mControl)
         mControl->Stop();
     DestroyAllInstances();

@@ -3,6 +3,9 @@
 
 #include <Ecore.h>
 
+#include <cstdlib>
+#include <ctime>
+
 #include "app_common.h"
 #include "widget/AppEventDispatcher.h"
 #include "widget/ControlCommandHandler.h"
@@ -57,6 +60,37 @@ TEST(AppEvents, LanguageKeyBecomesALanguageList)
     EXPECT_EQ(AppEventDispatcher::LanguageList("de"), "de");
     EXPECT_EQ(AppEventDispatcher::LanguageList("C.UTF-8"), "");
     EXPECT_EQ(AppEventDispatcher::LanguageList(""), "");
+}
+
+TEST(AppEvents, TimeZoneKeySetsLocalTimeOnlyForAKnownZone)
+{
+    const char* old = getenv("TZ");
+    std::string saved = old ? old : "";
+    struct Case
+    {
+        const char* zone;
+        bool applied;
+    };
+    const Case cases[] = {{"Asia/Tokyo", true},
+                          {"", false},
+                          {"Nowhere/City", false},
+                          {"../../etc/passwd", false},
+                          {"/usr/share/zoneinfo/UTC", false},
+                          {"Asia/Tokyo;x", false}};
+    for (const Case& c : cases)
+    {
+        ASSERT_TRUE(AppEventDispatcher::ApplyTimeZone("Europe/London"));
+        EXPECT_EQ(AppEventDispatcher::ApplyTimeZone(c.zone), c.applied) << c.zone;
+        time_t noon = 1700000000;
+        struct tm local;
+        localtime_r(&noon, &local);
+        EXPECT_EQ(local.tm_gmtoff, c.applied ? 9 * 3600 : 0) << c.zone;
+    }
+    if (old)
+        setenv("TZ", saved.c_str(), 1);
+    else
+        unsetenv("TZ");
+    tzset();
 }
 
 TEST(AppEvents, HandlerRulesFollowThePlatform)

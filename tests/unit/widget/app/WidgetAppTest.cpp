@@ -12,12 +12,14 @@
 #include <thread>
 
 #include "SampleCities.h"
+#include "TestDB.h"
 #include "WeatherDefine.h"
 #include "WidgetHostPages.h"
 
 namespace WeatherTest
 {
 
+using ::testing::Contains;
 using ::testing::HasSubstr;
 
 namespace
@@ -212,7 +214,7 @@ TEST_F(WidgetAppTest, EverySystemChangeRedrawsEveryInstance)
     }
 }
 
-TEST_F(WidgetAppTest, ClockFormatChangesTheTimeTextWithoutNewData)
+TEST_F(WidgetAppTest, ClockFormatAndTimeZoneChangeTheTimeTextWithoutNewData)
 {
     struct Case
     {
@@ -221,9 +223,11 @@ TEST_F(WidgetAppTest, ClockFormatChangesTheTimeTextWithoutNewData)
         const char* value;
     };
     const Case cases[] = {{"int", "db/menu_widget/regionformat_time1224", "2"},
-                          {"int", "db/menu_widget/regionformat_time1224", "1"}};
+                          {"int", "db/menu_widget/regionformat_time1224", "1"},
+                          {"string", "db/setting/timezone_id", "Asia/Tokyo"}};
     WriteCities(1);
     SetKey("db/menu_widget/regionformat_time1224", 1);
+    ASSERT_EQ(vconf_set_str("db/setting/timezone_id", "Europe/London"), 0);
     StartHost({"4x2"});
     for (const Case& c : cases)
     {
@@ -291,6 +295,26 @@ TEST_F(WidgetAppTest, StartUpOnAnEmptyRootCreatesTheDatabasesAndShowsNoCity)
         EXPECT_EQ(stat((mRoot.SharedDataDir() + "/db/" + file).c_str(), &st), 0) << file;
     ASSERT_TRUE(ReadSetting());
     EXPECT_THAT(Slot(Id(1), "centerLayout"), HasSubstr("\"group\":\"noCity\""));
+}
+
+TEST_F(WidgetAppTest, StartUpUpgradesAnOldWeatherDatabaseBeforeReadingIt)
+{
+    WriteCities(2);
+    {
+        // What a 0.6 installation left: the two later columns missing.
+        RawDB weather(mRoot.SharedDataDir() + "/db/.weather.db");
+        weather.Exec("ALTER TABLE CITY_TABLE DROP COLUMN isSummerTime;");
+        weather.Exec("ALTER TABLE EXTRA_WEATHER_TABLE DROP COLUMN precProbabilityNight;");
+        RawDB version(mRoot.SharedDataDir() + "/db/.version.db");
+        version.Exec("UPDATE VERSION_TABLE SET dbVersion = 0.6;");
+    }
+    StartHost({"4x2"});
+    EXPECT_NE(CentreText(Id(1), "name"), "");
+    RawDB weather(mRoot.SharedDataDir() + "/db/.weather.db", true);
+    EXPECT_THAT(weather.ColumnNames("CITY_TABLE"), Contains("isSummerTime"));
+    EXPECT_DOUBLE_EQ(RawDB(mRoot.SharedDataDir() + "/db/.version.db", true)
+                         .QueryDouble("SELECT dbVersion FROM VERSION_TABLE"),
+                     0.8);
 }
 
 }  // namespace WeatherTest
