@@ -75,13 +75,6 @@ public:
         WaitIdle();
     }
 
-    int CountLaunches(const std::string& part) const
-    {
-        int count = 0;
-        for (const std::string& line : Launches()) count += line.find(part) != std::string::npos;
-        return count;
-    }
-
     void Refreshing(bool refreshing)
     {
         ChangeSetting(

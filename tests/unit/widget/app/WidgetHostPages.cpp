@@ -163,6 +163,25 @@ std::vector<std::string> WidgetHostPagesTest::Launches() const
     return ReadLines(mRoot.Path("log/launch.log"));
 }
 
+int WidgetHostPagesTest::CountLaunches(const std::string& part) const
+{
+    int count = 0;
+    for (const std::string& line : Launches()) count += line.find(part) != std::string::npos;
+    return count;
+}
+
+bool WidgetHostPagesTest::WaitUntil(const std::function<bool()>& done, double seconds)
+{
+    auto end = std::chrono::steady_clock::now() + std::chrono::duration<double>(seconds);
+    while (!done())
+    {
+        if (std::chrono::steady_clock::now() > end)
+            return done();
+        std::this_thread::sleep_for(std::chrono::milliseconds(20));
+    }
+    return true;
+}
+
 int WidgetHostPagesTest::CountLog(const std::string& text) const
 {
     int count = 0;

@@ -31,13 +31,6 @@ public:
     void Tap(const char* where) { EXPECT_EQ(Send("tap " + Id(1) + " " + where).compare(0, 2, "OK"), 0); }
 
     void ForgetAgent() const { unlink(mRoot.Path("apps/com.quorvex.weather-m-agent/app.conf").c_str()); }
-
-    int CountLaunches(const std::string& part) const
-    {
-        int count = 0;
-        for (const std::string& line : Launches()) count += line.find(part) != std::string::npos;
-        return count;
-    }
 };
 
 TEST_F(WidgetTapsTest, TapsOpenTheApplicationTheAddCityFlowOrTheProviderPage)
