@@ -25,11 +25,6 @@ using ::testing::Not;
 
 namespace
 {
-const char* const kRefreshRequest = "\"MESSAGE\":\"REQUEST_ALL_WEATHER_INFO\"";
-const char* const kCurrentLocationRequest =
-    "\"MESSAGE\":\"REQUEST_CURRENT_LOCATION_WEATHER_INFO_FOR_SIMPLE_ADD_PROCESS\"";
-// The refresh button of a 4x2 page (712x354).
-const char* const kRefreshButton = "658 312";
 // A temperature the agent's weather never has: shows which data a page draws.
 const char* const kOldTemperature = "99";
 const char* const kIdleButton = "weather_box_ic_refresh.png";
@@ -58,9 +53,10 @@ public:
     static void AgeWeather()
     {
         RawDB(NSWeather::FileUtil::GetWeatherDBFilePath())
-            .Exec("UPDATE CITY_TABLE SET refreshedTime = refreshedTime - 7200;"
-                  "UPDATE CURRENT_WEATHER_TABLE SET curTemperature = " +
-                  std::string(kOldTemperature));
+            .Exec(
+                "UPDATE CITY_TABLE SET refreshedTime = refreshedTime - 7200;"
+                "UPDATE CURRENT_WEATHER_TABLE SET curTemperature = " +
+                std::string(kOldTemperature));
     }
 
     static std::string CityName(const std::string& locationId)
@@ -111,10 +107,11 @@ TEST_F(SuiteTest, RefreshButtonRunsTheAgentAndEveryInstanceDrawsItsWeather)
     EXPECT_THAT(launches[0], HasSubstr("\"app_id\":\"com.quorvex.weather-m-agent\""));
     EXPECT_THAT(launches[0], HasSubstr(std::string("\"extra\":{") + kRefreshRequest + "}"));
     EXPECT_EQ(CountLog("request 'REQUEST_ALL_WEATHER_INFO' (port '')"), 1);
-    EXPECT_EQ(CountLog("posted 'OK' to port 'com.quorvex.weather-m-widget.message.port.local'"), 1);
+    EXPECT_EQ(CountLog(std::string("posted 'OK' to port '") + NSWeather::WeatherAgent::WIDGET_PORT + "'"), 1);
 
     RawDB db(NSWeather::FileUtil::GetWeatherDBFilePath(), true);
-    EXPECT_EQ(db.QueryInt("SELECT COUNT(*) FROM CITY_TABLE WHERE refreshedTime < " + std::to_string(start)), 0);
+    EXPECT_EQ(db.QueryInt("SELECT COUNT(*) FROM CITY_TABLE WHERE refreshedTime < " + std::to_string(start)),
+              0);
     EXPECT_EQ(db.QueryInt(std::string("SELECT COUNT(*) FROM CURRENT_WEATHER_TABLE WHERE curTemperature = ") +
                           kOldTemperature),
               0);
@@ -147,7 +144,7 @@ TEST_F(SuiteTest, ResumeAsksForTheCurrentLocationCityAndTheLoadingPageBecomesIt)
     EXPECT_TRUE(WaitUntil([&] { return !(name = CityName("kr-seoul:C")).empty(); })) << Log();
     EXPECT_TRUE(WaitUntil([&] { return CentreText(Id(1), "name") == name; })) << Slot(Id(1), "centerLayout");
     EXPECT_EQ(CountLaunches(kCurrentLocationRequest), 1);
-    EXPECT_EQ(CountLaunches("\"PORT_ID\":\"com.quorvex.weather-m-widget.message.port.local\""), 1);
+    EXPECT_EQ(CountLaunches(std::string("\"PORT_ID\":\"") + NSWeather::WeatherAgent::WIDGET_PORT + "\""), 1);
     WaitIdle();
     EXPECT_FALSE(ReadSetting()->GetIsNowRefreshing());
 }

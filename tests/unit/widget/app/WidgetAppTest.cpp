@@ -23,9 +23,6 @@ using ::testing::HasSubstr;
 namespace
 {
 const char* const kPort = "com.quorvex.weather-m-widget.message.port.local";
-const char* const kRefreshRequest = "\"MESSAGE\":\"REQUEST_ALL_WEATHER_INFO\"";
-const char* const kCurrentLocationRequest =
-    "\"MESSAGE\":\"REQUEST_CURRENT_LOCATION_WEATHER_INFO_FOR_SIMPLE_ADD_PROCESS\"";
 
 int RunTool(std::vector<std::string> args)
 {

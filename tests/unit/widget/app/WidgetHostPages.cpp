@@ -20,6 +20,10 @@ namespace WeatherTest
 {
 
 const char* const WidgetHostPagesTest::kWidgetId = "com.quorvex.weather-m-widget";
+const char* const WidgetHostPagesTest::kRefreshRequest = "\"MESSAGE\":\"REQUEST_ALL_WEATHER_INFO\"";
+const char* const WidgetHostPagesTest::kCurrentLocationRequest =
+    "\"MESSAGE\":\"REQUEST_CURRENT_LOCATION_WEATHER_INFO_FOR_SIMPLE_ADD_PROCESS\"";
+const char* const WidgetHostPagesTest::kRefreshButton = "658 312";
 
 void WidgetHostPagesTest::SetUp()
 {

@@ -20,6 +20,11 @@ class WidgetHostPagesTest : public PlatformTest
 {
 public:
     static const char* const kWidgetId;
+    // Launch-log texts of the two agent requests.
+    static const char* const kRefreshRequest;
+    static const char* const kCurrentLocationRequest;
+    // Where the refresh button of a 4x2 page (712x354) is tapped.
+    static const char* const kRefreshButton;
 
     void SetUp() override;
     void TearDown() override;
