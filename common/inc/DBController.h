@@ -56,9 +56,15 @@ public:
     int UpdateOnlyWidgetReferenceCount(const std::string& locationID, bool isIncrease);
     int UpdateOnlyMobileLink(CityPtr cityPtr);
     int ReorderCityData(CityPtrVectorPtr reorderPtrVector);
+    // Moves the city at one position of the page order to another, reading
+    // the order in the same transaction; the moved city's location id, or
+    // empty when a position is out of range or the write failed.
+    std::string MoveCityData(int fromPosition, int toPosition);
     int DeleteCityData(int pageIndex);
     int DeleteCityData(const std::string& locationID);
     int DeleteAllCityData();
+    // Found and removed in one transaction; ERR_OK also when there is none.
+    int DeleteCurrentLocationCityData();
     // Replaces every city in a single transaction: another process sees the
     // old list or the new one, never a half-written one.
     int DeleteAllCityDataAndInsertCityPtrVector(CityPtrVectorPtr cityPtrVector);

@@ -4,11 +4,13 @@
 #include <functional>
 #include <string>
 
+#include "City.h"
 #include "Setting.h"
 
 namespace NSWeather
 {
 
+class DBCycleCloser;
 class DBStatement;
 
 // The one settings row that the suite's processes share ("db/.setting.db").
@@ -38,6 +40,12 @@ public:
     // written, or null (nothing written, logged) when there is no row or any
     // step fails.
     SettingPtr SelectAndUpdate(const std::function<void(const SettingPtr&)>& change);
+    // As SelectAndUpdate, and `change` also gets the stored cities in page
+    // order (without forecasts), read from the weather database in the same
+    // transaction: a city change of another process lands wholly before
+    // what `change` sees or after what it writes.
+    SettingPtr SelectAndUpdateWithCities(
+        const std::function<void(const SettingPtr&, const CityPtrVector&)>& change);
     // The settings row has had the same columns in every version.
     void UpgradeDB(double currentVersion);
 
@@ -45,6 +53,8 @@ private:
     static void BindSetting(DBStatement& statement, const SettingPtr& settingPtr);
     static SettingPtr ReadSetting(const DBStatement& statement);
     SettingPtr SelectRow();
+    // The read, change and write of the two operations above, on their cycle.
+    SettingPtr ChangeRow(DBCycleCloser& cycle, const std::function<void(const SettingPtr&)>& change);
     bool UpdateRow(const SettingPtr& settingPtr);
 };
 

@@ -148,35 +148,38 @@ bool WeatherAppCommands::ChangeSetting(const std::function<void(const SettingPtr
 
 bool WeatherAppCommands::KeepCurrentCityValid()
 {
-    CityPtrVectorPtr cityPtrVector = DBController().SelectAllCityData();
-    SIBLING_RETV_IF(!cityPtrVector, false);
-    std::string ignored;
-    return ChangeSetting(
-        [&cityPtrVector](const SettingPtr& settingPtr)
+    SettingPtr settingPtr = SettingDBController().SelectAndUpdateWithCities(
+        [](const SettingPtr& s, const CityPtrVector& cityPtrVector)
         {
-            for (const CityPtr& cityPtr : *cityPtrVector)
+            for (const CityPtr& cityPtr : cityPtrVector)
             {
-                if (cityPtr->GetLocationId() == settingPtr->GetCurrentCityLocationId())
+                if (cityPtr->GetLocationId() == s->GetCurrentCityLocationId())
                 {
-                    settingPtr->SetCurrentCityIndex(cityPtr->GetPageIndex());
+                    s->SetCurrentCityIndex(cityPtr->GetPageIndex());
                     return;
                 }
             }
-            bool isEmpty = cityPtrVector->empty();
-            settingPtr->SetCurrentCityLocationId(isEmpty ? std::string()
-                                                         : cityPtrVector->front()->GetLocationId());
-            settingPtr->SetCurrentCityIndex(0);
-        },
-        ignored);
+            s->SetCurrentCityLocationId(cityPtrVector.empty() ? std::string()
+                                                              : cityPtrVector.front()->GetLocationId());
+            s->SetCurrentCityIndex(0);
+        });
+    if (!settingPtr)
+        SIBLING_LOG("the current city could not be checked");
+    return settingPtr != nullptr;
 }
 
 bool WeatherAppCommands::Delete(const std::string& locationId)
 {
     DBController dbController;
     SIBLING_RETV_IF(dbController.DeleteCityData(locationId) != ERR_OK, false);
-    if (dbController.DeleteUselessMoonPhaseData() != ERR_OK)
-        SIBLING_LOG("moon rows could not be removed");
+    ForgetUnusedMoonRows();
     return true;
+}
+
+void WeatherAppCommands::ForgetUnusedMoonRows()
+{
+    if (DBController().DeleteUselessMoonPhaseData() != ERR_OK)
+        SIBLING_LOG("moon rows could not be removed");
 }
 
 int WeatherAppCommands::Add(const std::string& query, std::string& out)
@@ -221,19 +224,18 @@ int WeatherAppCommands::Move(const std::string& from, const std::string& to, std
 {
     int fromIndex = ParseIndex(from);
     int toIndex = ParseIndex(to);
-    CityPtrVectorPtr cityPtrVector = DBController().SelectAllCityData();
-    if (!cityPtrVector)
+    int count = DBController().GetNumberOfCities();
+    if (count < 0)
         return Fail(out, "the cities cannot be read");
-    int count = static_cast<int>(cityPtrVector->size());
     if (fromIndex < 0 || toIndex < 0 || fromIndex >= count || toIndex >= count)
         return Fail(out, "pages run from 0 to " + std::to_string(count - 1));
-    CityPtr movedPtr = (*cityPtrVector)[fromIndex];
-    cityPtrVector->erase(cityPtrVector->begin() + fromIndex);
-    cityPtrVector->insert(cityPtrVector->begin() + toIndex, movedPtr);
-    if (DBController().ReorderCityData(cityPtrVector) != ERR_OK)
+    // The order is read again inside the write: a change made meanwhile by
+    // another process is moved with, not undone.
+    std::string movedId = DBController().MoveCityData(fromIndex, toIndex);
+    if (movedId.empty())
         return Fail(out, "the new order could not be stored");
     KeepCurrentCityValid();
-    out += "moved " + movedPtr->GetLocationId() + " to page " + std::to_string(toIndex) + "\n";
+    out += "moved " + movedId + " to page " + std::to_string(toIndex) + "\n";
     return ERR_OK;
 }
 
@@ -268,15 +270,25 @@ int WeatherAppCommands::SetCurrent(const std::string& which, std::string& out)
     CityPtr cityPtr = FindStored(which);
     if (!cityPtr)
         return Fail(out, "no stored city '" + which + "'");
-    if (!ChangeSetting(
-            [&cityPtr](const SettingPtr& settingPtr)
+    std::string locationId = cityPtr->GetLocationId();
+    bool isStored = false;
+    SettingPtr settingPtr = SettingDBController().SelectAndUpdateWithCities(
+        [&locationId, &isStored](const SettingPtr& s, const CityPtrVector& cityPtrVector)
+        {
+            for (const CityPtr& storedPtr : cityPtrVector)
             {
-                settingPtr->SetCurrentCityLocationId(cityPtr->GetLocationId());
-                settingPtr->SetCurrentCityIndex(cityPtr->GetPageIndex());
-            },
-            out))
-        return ERR_FAIL;
-    out += "current city " + cityPtr->GetLocationId() + "\n";
+                if (storedPtr->GetLocationId() != locationId)
+                    continue;
+                isStored = true;
+                s->SetCurrentCityLocationId(locationId);
+                s->SetCurrentCityIndex(storedPtr->GetPageIndex());
+            }
+        });
+    if (!settingPtr)
+        return Fail(out, "the settings could not be written");
+    if (!isStored)
+        return Fail(out, locationId + " was removed meanwhile");
+    out += "current city " + locationId + "\n";
     return ERR_OK;
 }
 
@@ -336,13 +348,13 @@ int WeatherAppCommands::SetLocation(const std::string& onOff, std::string& out)
             },
             out))
         return ERR_FAIL;
-    DBController dbController;
-    std::string currentLocationId = dbController.GetLocationIdOfCurrentCity();
-    // Without the current location its city goes too.
-    if (!isOn && !currentLocationId.empty())
+    // Without the current location its city goes too, found inside the
+    // delete so that a city the agent has just put in its place goes as well.
+    if (!isOn)
     {
-        if (!Delete(currentLocationId))
-            return Fail(out, currentLocationId + " could not be removed");
+        if (DBController().DeleteCurrentLocationCityData() != ERR_OK)
+            return Fail(out, "the current-location city could not be removed");
+        ForgetUnusedMoonRows();
         KeepCurrentCityValid();
     }
     out += "location " + onOff + "\n";

@@ -42,10 +42,12 @@ private:
     CatalogueCityPtr FindPlace(const std::string& query) const;
     // A stored city by page index (digits) or location id; null if none.
     static CityPtr FindStored(const std::string& which);
-    // Points the settings' current city at a stored one when it names none.
+    // Points the settings' current city at a stored one when it names none,
+    // reading the cities in the settings' write transaction.
     static bool KeepCurrentCityValid();
     // Removes a city with its rows and its unused moon rows.
     static bool Delete(const std::string& locationId);
+    static void ForgetUnusedMoonRows();
     static bool ChangeSetting(const std::function<void(const SettingPtr&)>& change, std::string& out);
 
     CityCataloguePtr mCataloguePtr;

@@ -1,6 +1,7 @@
 #include "CityDBController.h"
 
 #include <functional>
+#include <map>
 #include <vector>
 
 #include "CommonLog.h"
@@ -330,6 +331,15 @@ std::vector<std::pair<int, CityPtr>> CityDBController::SelectAll()
     DBStatement stmt(mQueryGenernator.MakeSelectQuery(TABLE_NAME, std::string(INSERT_COLUMNS) + ",PK_ID",
                                                       mQueryGenernator.MakeOrderByClause("PK_ID", true)));
     while (stmt.Step() == SQLITE_ROW) rows.emplace_back(stmt.ColumnInt(15), ReadCity(stmt));
+    return rows;
+}
+
+std::vector<std::pair<int, CityPtr>> CityDBController::SelectAllInPageOrder()
+{
+    std::map<int, std::pair<int, CityPtr>> rowByPage;
+    for (const auto& row : SelectAll()) rowByPage.emplace(row.second->GetPageIndex(), row);
+    std::vector<std::pair<int, CityPtr>> rows;
+    for (auto row = rowByPage.lower_bound(0); row != rowByPage.end(); ++row) rows.push_back(row->second);
     return rows;
 }
 

@@ -88,6 +88,22 @@ sqlite3_stmt* DBConnector::DBPrepareQuery(const char* query)
     return stmt;
 }
 
+bool DBConnector::DBAttach(const std::string& dbFilePath)
+{
+    sqlite3_stmt* stmt = DBPrepareQuery("ATTACH DATABASE ? AS attached;");
+    COMMON_RETV_IF(!stmt, false);
+    sqlite3_bind_text(stmt, 1, dbFilePath.c_str(), -1, SQLITE_TRANSIENT);
+    int rc = sqlite3_step(stmt);
+    sqlite3_finalize(stmt);
+    if (rc != SQLITE_DONE)
+    {
+        COMMON_LOG("ATTACH %s rc [%d][%s]", dbFilePath.c_str(), rc, sqlite3_errmsg(mDBHandle));
+        mIsCycleFailed = true;
+        return false;
+    }
+    return true;
+}
+
 bool DBConnector::DBExecuteQuery(const char* query)
 {
     if (!mDBHandle || !query)

@@ -87,9 +87,7 @@ CityPtrVectorPtr DBController::SelectAllCities(CityDBController& cityDBControlle
     CityPtrVectorPtr cityPtrVector = std::make_shared<CityPtrVector>();
     if (cityDBController.GetNumberOfCities() <= 0)
         return cityPtrVector;
-    std::map<int, std::pair<int, CityPtr>> rowByPage;
-    for (const auto& row : cityDBController.SelectAll())
-        rowByPage.emplace(row.second->GetPageIndex(), row);  // the lowest key of a page wins
+    std::vector<std::pair<int, CityPtr>> rows = cityDBController.SelectAllInPageOrder();
     std::map<int, CurrentPtr> currentMap = CurrentWeatherDBController().SelectAll();
     std::map<int, WeeklyPtrVectorPtr> weeklyMap = WeeklyWeatherDBController().SelectAll();
     std::map<int, HourlyPtrVectorPtr> hourlyMap = HourlyWeatherDBController().SelectAll();
@@ -100,13 +98,13 @@ CityPtrVectorPtr DBController::SelectAllCities(CityDBController& cityDBControlle
     // cities after it stay in the list: stopping at the row count would
     // drop the last ones.
     int expectedPageIndex = 0;
-    for (auto row = rowByPage.lower_bound(0); row != rowByPage.end(); ++row)
+    for (const auto& row : rows)
     {
-        if (row->first != expectedPageIndex)
+        int primaryKey = row.first;
+        CityPtr cityPtr = row.second;
+        if (cityPtr->GetPageIndex() != expectedPageIndex)
             COMMON_LOG("!cityPtr");
-        expectedPageIndex = row->first + 1;
-        int primaryKey = row->second.first;
-        CityPtr cityPtr = row->second.second;
+        expectedPageIndex = cityPtr->GetPageIndex() + 1;
         cityPtr->SetCurrentPtr(FindOr(currentMap, primaryKey, CurrentPtr()));
         cityPtr->SetWeeklyPtrVector(FindOr(weeklyMap, primaryKey, std::make_shared<WeeklyPtrVector>()));
         cityPtr->SetHourlyPtrVector(FindOr(hourlyMap, primaryKey, std::make_shared<HourlyPtrVector>()));
@@ -313,6 +311,23 @@ int DBController::ReorderCityData(CityPtrVectorPtr reorderPtrVector)
     return ResultOf(cycle, CityDBController().Reorder(reorderPtrVector));
 }
 
+std::string DBController::MoveCityData(int fromPosition, int toPosition)
+{
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, std::string());
+    CityDBController cityDBController;
+    CityPtrVectorPtr orderPtrVector = std::make_shared<CityPtrVector>();
+    for (const auto& row : cityDBController.SelectAllInPageOrder()) orderPtrVector->push_back(row.second);
+    int count = static_cast<int>(orderPtrVector->size());
+    COMMON_RETV_IF(fromPosition < 0 || fromPosition >= count, std::string());
+    COMMON_RETV_IF(toPosition < 0 || toPosition >= count, std::string());
+    CityPtr movedPtr = (*orderPtrVector)[fromPosition];
+    orderPtrVector->erase(orderPtrVector->begin() + fromPosition);
+    orderPtrVector->insert(orderPtrVector->begin() + toPosition, movedPtr);
+    COMMON_RETV_IF(cycle.Close(cityDBController.Reorder(orderPtrVector)) == false, std::string());
+    return movedPtr->GetLocationId();
+}
+
 bool DBController::DeleteDataWithPrimaryKey(CityDBController& cityDBController, int primaryKey)
 {
     return cityDBController.Delete(primaryKey) && CurrentWeatherDBController().Delete(primaryKey) &&
@@ -336,6 +351,18 @@ int DBController::DeleteCityData(const std::string& locationID)
     CityDBController cityDBController;
     return ResultOf(cycle,
                     DeleteDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(locationID)));
+}
+
+int DBController::DeleteCurrentLocationCityData()
+{
+    DBCycleCloser cycle(GetWeatherDBFilePath(), WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, ERR_FAIL);
+    CityDBController cityDBController;
+    int pageIndex = cityDBController.GetPageIndexOfCurrentCity();
+    if (pageIndex < 0)
+        return ResultOf(cycle, true);
+    return ResultOf(cycle,
+                    DeleteDataWithPrimaryKey(cityDBController, cityDBController.GetPrimaryKey(pageIndex)));
 }
 
 bool DBController::DeleteAll(CityDBController& cityDBController)

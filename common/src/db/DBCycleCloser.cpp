@@ -35,6 +35,11 @@ DBCycleCloser::~DBCycleCloser()
     Close();
 }
 
+bool DBCycleCloser::Attach(const std::string& dbFilePath)
+{
+    return mDBConnector && mDBConnector->DBAttach(dbFilePath);
+}
+
 void DBCycleCloser::MarkFailed()
 {
     if (mDBConnector)

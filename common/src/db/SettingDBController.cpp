@@ -1,5 +1,6 @@
 #include "SettingDBController.h"
 
+#include "CityDBController.h"
 #include "CommonLog.h"
 #include "DBCycleCloser.h"
 #include "DBStatement.h"
@@ -126,6 +127,24 @@ SettingPtr SettingDBController::SelectAndUpdate(const std::function<void(const S
     COMMON_RETV_IF(!change, nullptr);
     DBCycleCloser cycle(GetSettingDBFilePath(), DBCycleCloser::Mode::WRITE);
     COMMON_RETV_IF(cycle.GetIsOpened() == false, nullptr);
+    return ChangeRow(cycle, change);
+}
+
+SettingPtr SettingDBController::SelectAndUpdateWithCities(
+    const std::function<void(const SettingPtr&, const CityPtrVector&)>& change)
+{
+    COMMON_RETV_IF(!change, nullptr);
+    DBCycleCloser cycle(GetSettingDBFilePath(), DBCycleCloser::Mode::WRITE);
+    COMMON_RETV_IF(cycle.GetIsOpened() == false, nullptr);
+    COMMON_RETV_IF(cycle.Attach(FileUtil::GetWeatherDBFilePath()) == false, nullptr);
+    CityPtrVector cityPtrVector;
+    for (const auto& row : CityDBController().SelectAllInPageOrder()) cityPtrVector.push_back(row.second);
+    return ChangeRow(cycle, [&](const SettingPtr& settingPtr) { change(settingPtr, cityPtrVector); });
+}
+
+SettingPtr SettingDBController::ChangeRow(DBCycleCloser& cycle,
+                                          const std::function<void(const SettingPtr&)>& change)
+{
     SettingPtr settingPtr = SelectRow();
     COMMON_RETV_IF(!settingPtr, nullptr);
     change(settingPtr);

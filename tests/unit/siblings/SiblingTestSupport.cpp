@@ -29,8 +29,13 @@ void SiblingFixture::TearDown()
 
 void SiblingFixture::RegisterPrograms() const
 {
-    mRoot.RegisterApp(NSWeather::WEATHER_AGENT_APP_ID, "exec=" + AgentProgram() + "\n");
-    mRoot.RegisterApp(NSWeather::WEATHER_APP_ID, "exec=" + AppProgram() + "\n");
+    SiblingTest::RegisterPrograms(mRoot);
+}
+
+void RegisterPrograms(const WeatherTest::TestPlatformRoot& root)
+{
+    root.RegisterApp(NSWeather::WEATHER_AGENT_APP_ID, "exec=" + AgentProgram() + "\n");
+    root.RegisterApp(NSWeather::WEATHER_APP_ID, "exec=" + AppProgram() + "\n");
 }
 
 std::string AgentProgram()
@@ -43,7 +48,7 @@ std::string AppProgram()
     return WeatherTest::BuildDir() + "/siblings/app/weather-app";
 }
 
-pid_t Start(const std::vector<std::string>& args)
+pid_t Start(const std::vector<std::string>& args, const std::string& outputPath)
 {
     std::vector<char*> argv;
     for (const std::string& arg : args) argv.push_back(const_cast<char*>(arg.c_str()));
@@ -51,9 +56,9 @@ pid_t Start(const std::vector<std::string>& args)
     pid_t pid = fork();
     if (pid == 0)
     {
-        int devNull = open("/dev/null", O_WRONLY);
-        dup2(devNull, STDOUT_FILENO);
-        dup2(devNull, STDERR_FILENO);
+        int output = open(outputPath.c_str(), O_WRONLY | O_CREAT | O_TRUNC, 0600);
+        dup2(output, STDOUT_FILENO);
+        dup2(output, STDERR_FILENO);
         execv(argv[0], argv.data());
         _exit(127);
     }
@@ -68,9 +73,9 @@ int Finish(pid_t pid)
     return WEXITSTATUS(status);
 }
 
-int Run(const std::vector<std::string>& args)
+int Run(const std::vector<std::string>& args, const std::string& outputPath)
 {
-    return Finish(Start(args));
+    return Finish(Start(args, outputPath));
 }
 
 }  // namespace SiblingTest

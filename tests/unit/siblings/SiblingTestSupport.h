@@ -27,11 +27,14 @@ protected:
 
 std::string AgentProgram();
 std::string AppProgram();
-// Starts a built program with the test's environment, output discarded.
-pid_t Start(const std::vector<std::string>& args);
+// Registers the built agent and app under `root` as the suite's programs.
+void RegisterPrograms(const WeatherTest::TestPlatformRoot& root);
+// Starts a built program with the test's environment; its output goes to
+// `outputPath`.
+pid_t Start(const std::vector<std::string>& args, const std::string& outputPath = "/dev/null");
 // The program's exit status, -1 when it did not exit normally.
 int Finish(pid_t pid);
-int Run(const std::vector<std::string>& args);
+int Run(const std::vector<std::string>& args, const std::string& outputPath = "/dev/null");
 
 }  // namespace SiblingTest
 

@@ -56,6 +56,8 @@ public:
     CityPtr Select(const std::string& locationId);
     // Every row as (PK_ID, city without children), in PK_ID order.
     std::vector<std::pair<int, CityPtr>> SelectAll();
+    // The rows with a page, in page order; the lowest key of a page wins.
+    std::vector<std::pair<int, CityPtr>> SelectAllInPageOrder();
 
 private:
     using Binder = std::function<void(DBStatement&)>;

@@ -29,6 +29,9 @@ public:
     bool GetIsCycleFailed() const { return mIsCycleFailed; }
     // The caller owns the statement and finalises it (see DBStatement).
     sqlite3_stmt* DBPrepareQuery(const char* query);
+    // Makes a second file's tables readable in this cycle under their own
+    // names; it is read in the cycle's transaction and detached on close.
+    bool DBAttach(const std::string& dbFilePath);
     bool DBExecuteQuery(const char* query);
     bool GetIsOpened() const { return mDBHandle != nullptr; }
     // SQLite's result code of the last failed call on the open handle.

@@ -29,6 +29,9 @@ public:
 
     // False (and logged) when the file could not be opened.
     bool GetIsOpened() const { return mDBConnector != nullptr; }
+    // Another database file read in this cycle's transaction (see
+    // DBConnector::DBAttach); false, and the cycle failed, when it cannot be.
+    bool Attach(const std::string& dbFilePath);
     // The cycle is rolled back however the rest of it goes.
     void MarkFailed();
     // Ends the cycle now, once its statements are finalised; a cycle whose

@@ -25,9 +25,6 @@ using ::testing::HasSubstr;
 namespace
 {
 const char* const kPort = "com.quorvex.weather-m-widget.message.port.local";
-const char* const kRefreshRequest = "\"MESSAGE\":\"REQUEST_ALL_WEATHER_INFO\"";
-const char* const kCurrentLocationRequest =
-    "\"MESSAGE\":\"REQUEST_CURRENT_LOCATION_WEATHER_INFO_FOR_SIMPLE_ADD_PROCESS\"";
 
 int RunTool(std::vector<std::string> args)
 {
@@ -75,13 +72,6 @@ public:
             std::this_thread::sleep_for(std::chrono::milliseconds(20));
         EXPECT_GE(CountLog(text), count) << text;
         WaitIdle();
-    }
-
-    int CountLaunches(const std::string& part) const
-    {
-        int count = 0;
-        for (const std::string& line : Launches()) count += line.find(part) != std::string::npos;
-        return count;
     }
 
     void Refreshing(bool refreshing)

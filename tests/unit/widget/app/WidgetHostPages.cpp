@@ -20,6 +20,10 @@ namespace WeatherTest
 {
 
 const char* const WidgetHostPagesTest::kWidgetId = "com.quorvex.weather-m-widget";
+const char* const WidgetHostPagesTest::kRefreshRequest = "\"MESSAGE\":\"REQUEST_ALL_WEATHER_INFO\"";
+const char* const WidgetHostPagesTest::kCurrentLocationRequest =
+    "\"MESSAGE\":\"REQUEST_CURRENT_LOCATION_WEATHER_INFO_FOR_SIMPLE_ADD_PROCESS\"";
+const char* const WidgetHostPagesTest::kRefreshButton = "658 312";
 
 void WidgetHostPagesTest::SetUp()
 {
@@ -161,6 +165,25 @@ std::string WidgetHostPagesTest::CentreText(const std::string& id, const std::st
 std::vector<std::string> WidgetHostPagesTest::Launches() const
 {
     return ReadLines(mRoot.Path("log/launch.log"));
+}
+
+int WidgetHostPagesTest::CountLaunches(const std::string& part) const
+{
+    int count = 0;
+    for (const std::string& line : Launches()) count += line.find(part) != std::string::npos;
+    return count;
+}
+
+bool WidgetHostPagesTest::WaitUntil(const std::function<bool()>& done, double seconds)
+{
+    auto end = std::chrono::steady_clock::now() + std::chrono::duration<double>(seconds);
+    while (!done())
+    {
+        if (std::chrono::steady_clock::now() > end)
+            return done();
+        std::this_thread::sleep_for(std::chrono::milliseconds(20));
+    }
+    return true;
 }
 
 int WidgetHostPagesTest::CountLog(const std::string& text) const

@@ -20,6 +20,11 @@ class WidgetHostPagesTest : public PlatformTest
 {
 public:
     static const char* const kWidgetId;
+    // Launch-log texts of the two agent requests.
+    static const char* const kRefreshRequest;
+    static const char* const kCurrentLocationRequest;
+    // Where the refresh button of a 4x2 page (712x354) is tapped.
+    static const char* const kRefreshButton;
 
     void SetUp() override;
     void TearDown() override;
@@ -39,8 +44,14 @@ public:
     // The text of `part` in the centre page of an instance ("" if none).
     std::string CentreText(const std::string& id, const std::string& part);
     std::vector<std::string> Launches() const;
+    // Launch-log lines that contain `part`.
+    int CountLaunches(const std::string& part) const;
     // Lines of the widget process's log that contain `text`.
     int CountLog(const std::string& text) const;
+    // Polls `done` (every 20 ms, up to `seconds`); its last answer. For
+    // states the host's idle cannot tell: another process's work, or a page
+    // whose progress animation keeps the host busy.
+    static bool WaitUntil(const std::function<bool()>& done, double seconds = 30.0);
 
     pid_t mHostPid = -1;
     platform::ControlClient mClient;
