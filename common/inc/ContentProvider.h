@@ -3,6 +3,8 @@
 
 #include <string>
 
+#include "Setting.h"
+
 namespace NSWeather
 {
 
@@ -22,8 +24,9 @@ enum ContentProviderType
 class ContentProvider
 {
 public:
-    // One rebuild asks for the provider dozens of times; while an object
-    // of this class lives, the first successful read answers them all.
+    // One rebuild asks for the provider and its icon set dozens of times;
+    // while an object of this class lives, the first successful read of the
+    // settings answers them all.
     // Scopes nest; the answer is forgotten when the outermost one ends.
     class RebuildScope
     {
@@ -39,6 +42,9 @@ public:
     // A ContentProviderType; CP_ACCUWEATHER for an unknown text or when
     // the settings cannot be read.
     static int GetContentProvider();
+    // The settings record the provider comes from: read afresh, or once
+    // per RebuildScope. Null when it cannot be read.
+    static SettingPtr GetSetting();
     // Image file name without folder, or empty when no logo is shown.
     static std::string GetCPLogoIconPath(int style);
     // The code for one CpType text (exact comparison).

@@ -4,7 +4,6 @@
 #include "ContentProvider.h"
 #include "DBController.h"
 #include "Setting.h"
-#include "SettingDBController.h"
 
 namespace NSWeather
 {
@@ -54,7 +53,7 @@ int IconMappingTable::GetMappingIconNum(int iconNum, bool isDayTime)
         default:
         {
             COMMON_RETV_IF(iconNum >= ACCUWEATHER_ICON_ID_MAX || iconNum < 0, 0);
-            SettingPtr settingPtr = SettingDBController().Select();
+            SettingPtr settingPtr = ContentProvider::GetSetting();
             COMMON_RETV_IF(!settingPtr, 0);
             mapped = GetAccuWeatherIcon(iconNum, settingPtr->GetDaemonType());
             break;

@@ -10,8 +10,8 @@ namespace NSWeather
 namespace
 {
 int gScopeDepth = 0;
-// -1: nothing read in the current scope.
-int gScopedProvider = -1;
+// Null: nothing read in the current scope.
+SettingPtr gScopedSetting;
 }  // namespace
 
 ContentProvider::RebuildScope::RebuildScope()
@@ -22,20 +22,24 @@ ContentProvider::RebuildScope::RebuildScope()
 ContentProvider::RebuildScope::~RebuildScope()
 {
     if (--gScopeDepth == 0)
-        gScopedProvider = -1;
+        gScopedSetting.reset();
+}
+
+SettingPtr ContentProvider::GetSetting()
+{
+    if (gScopeDepth > 0 && gScopedSetting)
+        return gScopedSetting;
+    SettingPtr settingPtr = SettingDBController().Select();
+    if (gScopeDepth > 0)
+        gScopedSetting = settingPtr;
+    return settingPtr;
 }
 
 int ContentProvider::GetContentProvider()
 {
-    if (gScopeDepth > 0 && gScopedProvider >= 0)
-        return gScopedProvider;
-    SettingDBController settingDBController;
-    SettingPtr settingPtr = settingDBController.Select();
+    SettingPtr settingPtr = GetSetting();
     COMMON_RETV_IF(!settingPtr, CP_ACCUWEATHER);
-    int provider = GetContentProviderOfCpType(settingPtr->GetCpType());
-    if (gScopeDepth > 0)
-        gScopedProvider = provider;
-    return provider;
+    return GetContentProviderOfCpType(settingPtr->GetCpType());
 }
 
 int ContentProvider::GetContentProviderOfCpType(const std::string& cpType)

@@ -150,7 +150,9 @@ TEST_F(WidgetMainTest, TimeZoneIsWhatFollowsTheZoneFolder)
         SCOPED_TRACE(c.target ? c.target : "(no link)");
         unlink(link.c_str());
         if (c.target)
+        {
             ASSERT_EQ(symlink(c.target, link.c_str()), 0);
+        }
         ASSERT_EQ(vconf_set_str("db/setting/timezone_id", c.key), 0);
         EXPECT_EQ(WidgetMain::GetTimeZone(link), c.zone);
     }

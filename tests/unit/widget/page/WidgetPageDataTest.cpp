@@ -95,7 +95,9 @@ TEST_F(WidgetPageDataTest, CityNameFollowsProviderAndLanguage)
         UseProvider(c.provider);
         unlink(mRoot.Path("vconf/db/menu_widget/language").c_str());
         if (c.language)
+        {
             ASSERT_EQ(vconf_set_str("db/menu_widget/language", c.language), 0);
+        }
         city->SetCityName(c.cityName);
         EXPECT_EQ(mData.GetCityName(), c.expected)
             << c.provider << " " << (c.language ? c.language : "unset");
