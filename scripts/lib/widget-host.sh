@@ -63,23 +63,32 @@ host_stop() {
     host_pid=
 }
 
+# host_ctl COMMAND [ARGS]: one widgetctl command; its reply goes to
+# stderr only when it fails.
+host_ctl() {
+    if ! reply=$("$ctl" "$@" 2>&1); then
+        echo "widgetctl $*: $reply" >&2
+        return 1
+    fi
+}
+
 # host_shoot N FILE: a PNG of instance N (1 is the first instance).
 host_shoot() {
-    "$ctl" snapshot "$widget_id:$1" "$2" > /dev/null
+    host_ctl snapshot "$widget_id:$1" "$2"
 }
 
 # host_idle SECONDS: waits until no animation, job or short timer is left.
 host_idle() {
-    "$ctl" idle "$1" > /dev/null
+    host_ctl idle "$1"
 }
 
 # host_swipe N X1 Y1 X2 Y2: a 200 ms swipe on instance N, a flick when
 # it runs up or down over a page.
 host_swipe() {
-    "$ctl" swipe "$widget_id:$1" "$2" "$3" "$4" "$5" 200 > /dev/null
+    host_ctl swipe "$widget_id:$1" "$2" "$3" "$4" "$5" 200
 }
 
 # host_tap N X Y
 host_tap() {
-    "$ctl" tap "$widget_id:$1" "$2" "$3" > /dev/null
+    host_ctl tap "$widget_id:$1" "$2" "$3"
 }
