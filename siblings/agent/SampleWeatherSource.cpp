@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cmath>
 
+#include "CityTimeZone.h"
 #include "SunCalculator.h"
 
 namespace NSWeather
@@ -56,6 +57,20 @@ time_t FloorTo(time_t when, time_t step)
 time_t SolarMidnight(double longitude, time_t when)
 {
     return when - static_cast<time_t>(SunCalculator::GetSolarHour(longitude, when) * 3600.0);
+}
+
+// Local (civil) midnight of the day that contains `when`: a forecast day is
+// the day people in the city live, which can differ from the solar one by
+// more than an hour. Solar when the zone is unknown.
+time_t CivilMidnight(const CatalogueCity& place, time_t when)
+{
+    double offsetHours = 0.0;
+    bool isSummerTime = false;
+    if (!CityTimeZone::GetOffset(place.GetTimeZone(), when, offsetHours, isSummerTime))
+        return SolarMidnight(place.GetLongitude(), when);
+    time_t local = when + static_cast<time_t>(std::lround(offsetHours * 3600.0));
+    time_t intoDay = ((local % DAY) + DAY) % DAY;
+    return when - intoDay;
 }
 
 const char* MoonPhaseText(double age)
@@ -189,7 +204,7 @@ void SampleWeatherSource::FillHourly(const CatalogueCity& place, time_t now, int
 void SampleWeatherSource::FillDaily(const CatalogueCity& place, time_t now, int provider, City& city)
 {
     auto weeklyPtrVector = std::make_shared<WeeklyPtrVector>();
-    time_t midnight = SolarMidnight(place.GetLongitude(), now);
+    time_t midnight = CivilMidnight(place, now);
     for (int i = 0; i < DAILY_COUNT; ++i)
     {
         time_t day = midnight + i * DAY;

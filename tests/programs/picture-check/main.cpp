@@ -53,7 +53,8 @@ bool Check(Evas* canvas, const char* file, const Expectation& expectation)
     int width = 0;
     int height = 0;
     evas_object_image_size_get(image, &width, &height);
-    const void* data = error == EVAS_LOAD_ERROR_NONE ? evas_object_image_data_get(image, EINA_FALSE) : nullptr;
+    const void* data =
+        error == EVAS_LOAD_ERROR_NONE ? evas_object_image_data_get(image, EINA_FALSE) : nullptr;
     bool ok = false;
     if (!data)
         printf("%s: cannot be read (%s)\n", file, evas_load_error_str(error));

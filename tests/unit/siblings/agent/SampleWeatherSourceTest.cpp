@@ -118,6 +118,15 @@ TEST_F(SampleWeatherSourceTest, SameInputGivesSameWeatherAndPlausibleRows)
     }
 }
 
+// 23:13 UTC on a Sunday is already Monday in Paris (solar time there is
+// still Sunday): the first forecast day is the Monday, stamped at its noon.
+TEST_F(SampleWeatherSourceTest, ForecastDaysAreTheCitysCivilDays)
+{
+    CityPtr parisPtr = Fill("fr-paris", 1796598780);
+    ASSERT_TRUE(parisPtr);
+    EXPECT_EQ(parisPtr->GetWeeklyPtrVector()->at(0)->GetDate(), 1796641200);
+}
+
 TEST_F(SampleWeatherSourceTest, SeasonsLatitudeAndFrontsShowInTheWeather)
 {
     time_t january = Utc(2026, 1, 15, 12);
