@@ -125,7 +125,13 @@ bool WidgetHost::ParseOptions(int argc, char** argv)
 void WidgetHost::PrepareEnvironment()
 {
     if (!HasValue("DISPLAY") && !HasValue("WAYLAND_DISPLAY"))
+    {
         setenv("ELM_ENGINE", "buffer", 1);
+        // Elementary resizes a window's canvas from several places; with the
+        // buffer engine each resize frees the pixels a render thread may still
+        // be drawing into. Off screen, nothing is gained by drawing in a thread.
+        setenv("ECORE_EVAS_FORCE_SYNC_RENDER", "1", 1);
+    }
     // glibc ignores LANGUAGE under the C locale, so catalogues would never load.
     const char* lang = getenv("LANG");
     if (!HasValue("LC_ALL") && (!lang || !*lang || !strcmp(lang, "C") || !strcmp(lang, "POSIX")))

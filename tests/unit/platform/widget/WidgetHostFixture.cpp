@@ -166,9 +166,16 @@ int WidgetHostTest::WaitForExit(double seconds)
         if (waitpid(mHostPid, &status, WNOHANG) == mHostPid)
         {
             mHostPid = -1;
-            if (WIFSIGNALED(status))
-                ADD_FAILURE() << "the host died of signal " << WTERMSIG(status);
-            return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+            int code = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+            // A sanitizer report ends the host with an exit code, not a signal.
+            if (WIFSIGNALED(status) || code != 0)
+            {
+                std::string output = ReadText(mRoot.Path("host.out"));
+                ADD_FAILURE() << "the host ended with " << (WIFSIGNALED(status) ? "signal " : "code ")
+                              << (WIFSIGNALED(status) ? WTERMSIG(status) : code) << "; its output ends:\n"
+                              << output.substr(output.size() > 4000 ? output.size() - 4000 : 0);
+            }
+            return code;
         }
         std::this_thread::sleep_for(std::chrono::milliseconds(20));
     }
