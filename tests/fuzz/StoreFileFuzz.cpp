@@ -2,15 +2,17 @@
 // installation left it. The first byte picks the weather, settings or version
 // file, the rest is its content; the other two are sound files made by the
 // store itself. Every reader, and the start-up upgrade, must log and give a
-// safe result.
+// safe result, and so must the clock of each city read.
 #include <cstdint>
 #include <string>
 #include <unistd.h>
 
+#include "ContentProvider.h"
 #include "DBController.h"
 #include "FileUtil.h"
 #include "FuzzRoot.h"
 #include "SettingDBController.h"
+#include "TimeUtil.h"
 #include "StoreSeeds.h"
 #include "UpgradeDBController.h"
 
@@ -45,7 +47,13 @@ void ReadEverything()
     DBController dbController;
     CityPtrVectorPtr cities = dbController.SelectAllCityData();
     if (cities)
-        for (const CityPtr& city : *cities) FUZZ_CHECK(city != nullptr);
+        for (const CityPtr& city : *cities)
+        {
+            FUZZ_CHECK(city != nullptr);
+            // What the widget first computes from a city it shows: its clock.
+            TimeUtil::GetIsDay(city, 1700000000);
+            TimeUtil::GetLocalTimeStringLong(city, CP_ACCUWEATHER);
+        }
     dbController.GetIsWeatherInfoExpired();
     SettingDBController().Select();
     UpgradeDBController().UpgradeIfNeeded();
