@@ -27,6 +27,8 @@ private:
 
 // Writes the bytes as the whole file; false when it cannot.
 bool WriteBytes(const std::string& path, const std::string& bytes);
+// The whole file; empty when it cannot be read.
+std::string ReadBytes(const std::string& path);
 
 [[noreturn]] void FuzzFail(const char* what, const char* file, int line);
 

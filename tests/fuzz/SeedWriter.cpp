@@ -143,13 +143,7 @@ std::string Compacted(const std::string& path)
     FUZZ_CHECK(sqlite3_open(path.c_str(), &db) == SQLITE_OK);
     FUZZ_CHECK(sqlite3_exec(db, "PRAGMA page_size=512; VACUUM;", nullptr, nullptr, nullptr) == SQLITE_OK);
     sqlite3_close(db);
-    std::string content;
-    FILE* file = fopen(path.c_str(), "rb");
-    FUZZ_CHECK(file != nullptr);
-    char buffer[4096];
-    for (size_t n = 0; (n = fread(buffer, 1, sizeof(buffer), file)) > 0;) content.append(buffer, n);
-    fclose(file);
-    return content;
+    return WeatherTest::ReadBytes(path);
 }
 
 void WriteStoreSeeds()

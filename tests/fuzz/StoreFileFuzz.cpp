@@ -6,6 +6,7 @@
 #include <cstdint>
 #include <string>
 #include <unistd.h>
+#include <vector>
 
 #include "ContentProvider.h"
 #include "DBController.h"
@@ -28,19 +29,6 @@ struct StoreFile
 };
 
 std::vector<StoreFile> gFiles;
-
-std::string ReadAll(const std::string& path)
-{
-    std::string content;
-    FILE* file = fopen(path.c_str(), "rb");
-    if (!file)
-        return content;
-    char buffer[4096];
-    size_t n = 0;
-    while ((n = fread(buffer, 1, sizeof(buffer), file)) > 0) content.append(buffer, n);
-    fclose(file);
-    return content;
-}
 
 void ReadEverything()
 {
@@ -67,7 +55,7 @@ extern "C" int LLVMFuzzerInitialize(int*, char***)
     WeatherTest::WriteSoundStore();
     for (const std::string& path : {FileUtil::GetWeatherDBFilePath(), FileUtil::GetSettingDBFilePath(),
                                     FileUtil::GetVersionDBFilePath()})
-        gFiles.push_back({path, ReadAll(path)});
+        gFiles.push_back({path, WeatherTest::ReadBytes(path)});
     return 0;
 }
 
