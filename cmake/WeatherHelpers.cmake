@@ -16,7 +16,13 @@ endfunction()
 
 function(weather_apply_flags target)
   target_compile_options(${target} PRIVATE ${WEATHER_WARNINGS})
-  if(WEATHER_SANITIZE)
+  if(WEATHER_FUZZ)
+    # Coverage for the fuzzer everywhere; the fuzzer's main is linked only
+    # into the fuzz targets. Undefined behaviour stops the run like a crash.
+    target_compile_options(${target} PRIVATE -fsanitize=fuzzer-no-link,address,undefined
+                           -fno-sanitize-recover=undefined -fno-omit-frame-pointer)
+    target_link_options(${target} PRIVATE -fsanitize=address,undefined)
+  elseif(WEATHER_SANITIZE)
     target_compile_options(${target} PRIVATE -fsanitize=address,undefined -fno-omit-frame-pointer)
     target_link_options(${target} PRIVATE -fsanitize=address,undefined)
   endif()

@@ -1,6 +1,8 @@
 #include "DBController.h"
 
 #include <algorithm>
+#include <climits>
+#include <cstdint>
 #include <ctime>
 #include <map>
 #include <utility>
@@ -97,14 +99,15 @@ CityPtrVectorPtr DBController::SelectAllCities(CityDBController& cityDBControlle
     // writer mid-change) is skipped, never filled with a null city, and the
     // cities after it stay in the list: stopping at the row count would
     // drop the last ones.
-    int expectedPageIndex = 0;
+    // Wide enough for the page after the largest index a file can hold.
+    int64_t expectedPageIndex = 0;
     for (const auto& row : rows)
     {
         int primaryKey = row.first;
         CityPtr cityPtr = row.second;
         if (cityPtr->GetPageIndex() != expectedPageIndex)
             COMMON_LOG("!cityPtr");
-        expectedPageIndex = cityPtr->GetPageIndex() + 1;
+        expectedPageIndex = static_cast<int64_t>(cityPtr->GetPageIndex()) + 1;
         cityPtr->SetCurrentPtr(FindOr(currentMap, primaryKey, CurrentPtr()));
         cityPtr->SetWeeklyPtrVector(FindOr(weeklyMap, primaryKey, std::make_shared<WeeklyPtrVector>()));
         cityPtr->SetHourlyPtrVector(FindOr(hourlyMap, primaryKey, std::make_shared<HourlyPtrVector>()));
@@ -288,7 +291,8 @@ int DBController::UpdateOnlyWidgetReferenceCount(const std::string& locationID, 
     CityPtr cityPtr = cityDBController.Select(locationID);
     COMMON_RETV_IF(!cityPtr, ERR_FAIL);
     int count = cityPtr->GetWidgetReferenceCount();
-    count = isIncrease ? count + 1 : std::max(count - 1, 0);
+    // A count read from the file may already be at the limit.
+    count = isIncrease ? (count < INT_MAX ? count + 1 : count) : std::max(count - 1, 0);
     return ResultOf(cycle, cityDBController.UpdateOnlyWidgetReferenceCount(locationID, count));
 }
 
@@ -457,7 +461,9 @@ bool DBController::GetIsWeatherInfoExpired()
     // trusted and counts as expired.
     if (lastRefreshedTime > now)
         return true;
-    return now - lastRefreshedTime > timeInterval;
+    // Compared this way round, a refresh time far in the past read from the
+    // file cannot overflow the difference.
+    return lastRefreshedTime < now - timeInterval;
 }
 
 }  // namespace NSWeather

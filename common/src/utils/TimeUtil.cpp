@@ -1,5 +1,6 @@
 #include "TimeUtil.h"
 
+#include <cmath>
 #include <cstdlib>
 
 #include "CommonLog.h"
@@ -15,9 +16,30 @@ time_t TimeUtil::GetCurrentTime()
     return time(nullptr);
 }
 
+namespace
+{
+// Every place is within a day of UTC; beyond that (or not a number) the
+// offset came from a damaged file, and UTC serves.
+double SaneGmtOffset(double gmtOffset)
+{
+    if (std::isfinite(gmtOffset) && std::fabs(gmtOffset) <= 24.0)
+        return gmtOffset;
+    COMMON_LOG("gmtOffset %g is no offset of a place; UTC taken", gmtOffset);
+    return 0.0;
+}
+
+// 2^63: the doubles below it (and from its negative on) convert to time_t.
+const double kTimeLimit = 9223372036854775808.0;
+}  // namespace
+
 time_t TimeUtil::GetCityTime(time_t t, double gmtOffset)
 {
-    double shifted = static_cast<double>(t) - ICUUtil::GetTmGmtOff() + gmtOffset * 3600.0;
+    double shifted = static_cast<double>(t) - ICUUtil::GetTmGmtOff() + SaneGmtOffset(gmtOffset) * 3600.0;
+    if (!(shifted >= -kTimeLimit && shifted < kTimeLimit))
+    {
+        COMMON_LOG("time %lld cannot be shifted; taken as it is", static_cast<long long>(t));
+        return t;
+    }
     return static_cast<time_t>(shifted);
 }
 
@@ -47,8 +69,8 @@ bool TimeUtil::GetIsDay(const CityPtr& cityPtr, time_t t)
 std::string TimeUtil::GetLocalTimeStringLong(const CityPtr& cityPtr, int contentProvider)
 {
     COMMON_RETV_IF(!cityPtr, std::string());
-    time_t shifted =
-        GetCurrentTime() + static_cast<time_t>(cityPtr->GetGmtOffset() * 3600.0) - ICUUtil::GetTmGmtOff();
+    time_t shifted = GetCurrentTime() + static_cast<time_t>(SaneGmtOffset(cityPtr->GetGmtOffset()) * 3600.0) -
+                     ICUUtil::GetTmGmtOff();
     if (contentProvider != CP_ACCUWEATHER && cityPtr->GetIsSummerTime())
         shifted += 3600;
     int index = VconfUtil::GetRegionFormatTime1224() == VCONFKEY_TIME_FORMAT_12

@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <climits>
 #include <fstream>
 #include <functional>
 #include <random>
@@ -178,4 +179,44 @@ TEST_F(DBControllerBadInputTest, UnreadableCitiesAreNotExpired)
     ReplaceWeatherDB(std::string(2048, '\x01'));
     EXPECT_FALSE(DBController().GetIsWeatherInfoExpired());
     EXPECT_TRUE(mLog.Contains("(cityPtrVector == NULL) [return]")) << mLog.Dump();
+}
+
+// Values at the limits of their columns, as a damaged file or another writer
+// can leave them; each once overflowed a computation on it.
+TEST_F(DBControllerBadInputTest, ValuesAtTheLimitsOfTheirColumnsAreTakenSafely)
+{
+    InitializeSettings();
+    struct Case
+    {
+        const char* sql;
+        std::function<void(DBController&)> check;
+    };
+    const Case cases[] = {
+        {"UPDATE CITY_TABLE SET pageIndex = 2147483647 WHERE locationId = 'B'",
+         [](DBController& db)
+         {
+             CityPtrVectorPtr cities = db.SelectAllCityData();
+             ASSERT_TRUE(cities);
+             ASSERT_EQ(cities->size(), 2u);
+             EXPECT_EQ(cities->back()->GetPageIndex(), INT_MAX);
+         }},
+        {"UPDATE CITY_TABLE SET refreshedTime = -9223372036854775808",
+         [](DBController& db) { EXPECT_TRUE(db.GetIsWeatherInfoExpired()); }},
+        {"UPDATE CITY_TABLE SET widgetReferenceCount = 2147483647",
+         [](DBController& db)
+         {
+             EXPECT_EQ(db.UpdateOnlyWidgetReferenceCount("A", true), ERR_OK);
+             EXPECT_EQ(db.SelectCityData(std::string("A"))->GetWidgetReferenceCount(), INT_MAX);
+         }},
+    };
+    for (const Case& c : cases)
+    {
+        SCOPED_TRACE(c.sql);
+        DBController db;
+        CityPtrVectorPtr two =
+            std::make_shared<CityPtrVector>(CityPtrVector{MakeCity("A", 0), MakeCity("B", 1)});
+        ASSERT_EQ(db.DeleteAllCityDataAndInsertCityPtrVector(two), ERR_OK);
+        RawDB(WeatherDBPath()).Exec(c.sql);
+        c.check(db);
+    }
 }

@@ -4,6 +4,8 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <cmath>
+#include <limits>
 #include <string>
 #include <vector>
 
@@ -57,6 +59,23 @@ TEST_F(TimeUtilTest, CityTimeShiftsByTheDifferenceOfOffsets)
     EXPECT_EQ(TimeUtil::GetCityTime(kJuly14, 5.75), kJuly14 + 5 * kHour + 45 * 60);
     mTz.Set("<+01>-1");
     EXPECT_EQ(TimeUtil::GetCityTime(kJuly14, -3.5), kJuly14 - 4 * kHour - 30 * 60);
+}
+
+// Offsets and times a damaged weather database can hold.
+TEST_F(TimeUtilTest, OffsetsOfNoPlaceAndTimesAtTheLimitsAreTakenSafely)
+{
+    vconf_set_int(VCONFKEY_REGIONFORMAT_TIME1224, VCONFKEY_TIME_FORMAT_24);
+    const double kHuge = 1e300;
+    for (double offset : {std::nan(""), HUGE_VAL, -HUGE_VAL, kHuge, -kHuge, 24.5})
+    {
+        EXPECT_EQ(TimeUtil::GetCityTime(kJuly14, offset), kJuly14) << offset;
+        ExpectLongTextShiftedBy(MakeCity(offset), NSWeather::CP_ACCUWEATHER, 0,
+                                ICUUtil::SKELETON_EEEdMMM_HHmm);
+    }
+    const time_t kMax = std::numeric_limits<time_t>::max();
+    EXPECT_EQ(TimeUtil::GetCityTime(kMax, 1.0), kMax);
+    EXPECT_EQ(TimeUtil::GetCityTime(std::numeric_limits<time_t>::min(), -1.0),
+              std::numeric_limits<time_t>::min());
 }
 
 TEST_F(TimeUtilTest, LocalTimeOfACityAtFiveAndThreeQuarterHours)
