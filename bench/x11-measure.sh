@@ -43,6 +43,8 @@ cleanup() {
     [ -z "$pid" ] || stop_subject
     [ -z "$wm_pid" ] || kill "$wm_pid" 2> /dev/null || true
     [ -z "$server_pid" ] || kill "$server_pid" 2> /dev/null || true
+    # shellcheck disable=SC2046 # a list of pids
+    [ ! -s "$work/services" ] || kill $(sort -u "$work/services") 2> /dev/null || true
     wait 2> /dev/null || true
 }
 trap cleanup EXIT
@@ -115,9 +117,17 @@ start_subject() {
     pid=$!
 }
 
+# The process's children and theirs, but not EFL's desktop-file cache
+# daemon: like xfconfd, dconf and the accessibility bus it serves the whole
+# session, so it is left running (and ended at the end) and counted for
+# nobody.
 descendants() {
     local child
     for child in $(ps -o pid= --ppid "$1"); do
+        if [ "$(cat "/proc/$child/comm" 2> /dev/null)" = efreetd ]; then
+            echo "$child" >> "$work/services"
+            continue
+        fi
         echo "$child"
         descendants "$child"
     done
