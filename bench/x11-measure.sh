@@ -200,8 +200,7 @@ measure() {
         "$ctl" idle 10 > /dev/null || true
     fi
     sleep "$settle"
-    # shellcheck disable=SC2207 # pids are single words
-    tree=($pid $(descendants "$pid"))
+    mapfile -t tree < <(echo "$pid"; descendants "$pid")
     if [ "$keep" = 1 ]; then
         add_sample "$subject" mapped_ms "$ms"
         add_sample "$subject" rss_kib "$(sum_kib status VmRSS: "${tree[@]}")"
@@ -233,6 +232,6 @@ for subject in "${subjects[@]}"; do
         unit=${metric##*_}
         [ "$metric" != processes ] || unit=count
         printf 'x11\t%s\t%s\t%s\t%s\t%s\t%s\n' "$subject" "${metric%_*}" "$(echo "$values" | median)" \
-            "$unit" "$count" "$(echo $values | tr ' ' ',')" >> "$results"
+            "$unit" "$count" "$(tr ' ' ',' <<< "${values# }")" >> "$results"
     done
 done
