@@ -1,7 +1,8 @@
 // The yardstick of the widget's start-up and memory: a bare Elementary
-// window of one widget's size on the buffer engine. Prints "drawn" after
-// its first frame, then, with --stay, waits for stdin to close so that its
-// memory can be read.
+// window of a 4x2 widget's size, on the buffer engine or, with a display,
+// as an X11 window titled "bare-window". Prints "drawn" after its first
+// frame, then, with --stay, waits for stdin to close (or SIGTERM) so that
+// its memory can be read.
 #include <Elementary.h>
 
 #include <unistd.h>
@@ -40,11 +41,12 @@ int main(int argc, char** argv)
         setenv("ELM_ENGINE", "buffer", 1);
     elm_init(argc, argv);
     elm_app_base_scale_set(2.6);
-    Evas_Object* win = elm_win_add(nullptr, "bare", ELM_WIN_BASIC);
+    Evas_Object* win = elm_win_add(nullptr, "bare-window", ELM_WIN_BASIC);
+    elm_win_title_set(win, "bare-window");
     Evas_Object* background = elm_bg_add(win);
     elm_win_resize_object_add(win, background);
     evas_object_show(background);
-    evas_object_resize(win, 712, 712);
+    evas_object_resize(win, 712, 354);
     evas_event_callback_add(evas_object_evas_get(win), EVAS_CALLBACK_RENDER_POST, RenderPostCb, nullptr);
     evas_object_show(win);
     Ecore_Fd_Handler* handler =

@@ -1,8 +1,10 @@
 // The widget program as the host runs it, measured from outside: a port
-// message until every instance has been updated, process start until the
-// first instance exists beside a bare Elementary window's first frame, and
-// resident memory after flicks and updates beside that window's.
-// WIDGET_BENCH_FLICKS sets the number of flicks (1000).
+// message until every instance has been updated, one flick until the slide
+// has ended and the slots have turned, process start until the first
+// instance exists beside a bare Elementary window's first frame, and memory
+// (RSS and PSS) with two instances, settled and after flicks and updates,
+// beside that window's. WIDGET_BENCH_FLICKS sets the number of flicks of the
+// last one (1000).
 #include <benchmark/benchmark.h>
 #include <bundle.h>
 #include <message_port.h>
@@ -118,14 +120,70 @@ int CountUpdates()
     return count;
 }
 
-long ResidentKiB(pid_t pid)
+// The "<key> <n> kB" line of a /proc file of `pid`, or -1.
+double ProcKiB(pid_t pid, const char* file, const std::string& key)
 {
-    std::ifstream status("/proc/" + std::to_string(pid) + "/status");
+    std::ifstream status("/proc/" + std::to_string(pid) + "/" + file);
     std::string line;
     while (std::getline(status, line))
-        if (line.compare(0, 6, "VmRSS:") == 0)
-            return std::stol(line.substr(6));
+        if (line.compare(0, key.size(), key) == 0)
+            return std::stod(line.substr(key.size()));
     return -1;
+}
+
+// CPU time of every thread of `pid` so far: on a loaded machine the wall
+// time of a start-up says less than this.
+double CpuMs(pid_t pid)
+{
+    double ms = 0;
+    std::error_code error;
+    for (const auto& task :
+         std::filesystem::directory_iterator("/proc/" + std::to_string(pid) + "/task", error))
+    {
+        std::ifstream schedstat(task.path() / "schedstat");
+        double ns = 0;
+        if (schedstat >> ns)
+            ms += ns / 1e6;
+    }
+    return ms;
+}
+
+struct Memory
+{
+    double rssKiB;
+    // Shared pages divided among the processes that map them.
+    double pssKiB;
+};
+
+Memory ReadMemory(pid_t pid)
+{
+    return {ProcKiB(pid, "status", "VmRSS:"), ProcKiB(pid, "smaps_rollup", "Pss:")};
+}
+
+// The bare window's memory once it has drawn its first frame.
+Memory BareWindowMemory()
+{
+    int in = -1;
+    int out = -1;
+    pid_t bare = Spawn({BARE_WINDOW_PROGRAM, "--stay"}, &in, &out);
+    char buffer[16];
+    Memory memory = {-1, -1};
+    if (read(out, buffer, sizeof(buffer)) > 0)
+        memory = ReadMemory(bare);
+    close(in);
+    close(out);
+    waitpid(bare, nullptr, 0);
+    return memory;
+}
+
+void SetMemoryCounters(benchmark::State& state, const Memory& bare, const Memory& widget)
+{
+    state.counters["bare_rss_KiB"] = bare.rssKiB;
+    state.counters["bare_pss_KiB"] = bare.pssKiB;
+    state.counters["widget_rss_KiB"] = widget.rssKiB;
+    state.counters["widget_pss_KiB"] = widget.pssKiB;
+    state.counters["rss_ratio"] = widget.rssKiB / bare.rssKiB;
+    state.counters["pss_ratio"] = widget.pssKiB / bare.pssKiB;
 }
 
 void BM_PortMessageToEveryInstanceUpdated(benchmark::State& state)
@@ -153,6 +211,42 @@ double Seconds(Clock::time_point since)
     return std::chrono::duration<double>(Clock::now() - since).count();
 }
 
+// The city name shown in `slot` of the view, as a dump gives it.
+std::string SlotCityName(const std::string& dump, const std::string& slot)
+{
+    const std::string name = "\"group\":\"cityName\",\"texts\":{\"name\":\"";
+    size_t at = dump.find("\"" + slot + "\":{");
+    at = at == std::string::npos ? at : dump.find(name, at);
+    if (at == std::string::npos)
+        return std::string();
+    at += name.size();
+    return dump.substr(at, dump.find('"', at) - at);
+}
+
+// An upward flick on the 4x2 instance until the next city's page has moved
+// into the centre slot. The slide itself lasts 1 s.
+void BM_FlickToSlotsRotated(benchmark::State& state)
+{
+    Widget widget({"4x2", "4x4"});
+    widget.Send("idle 10");
+    const std::string dump = "dump " + std::string(kWidgetId) + ":1";
+    const std::string swipe = "swipe " + std::string(kWidgetId) + ":1 300 300 300 50 120";
+    for (auto _ : state)
+    {
+        std::string next = SlotCityName(widget.Send(dump), "nextLayout");
+        if (next.empty())
+            state.SkipWithError("no next city");
+        Clock::time_point start = Clock::now();
+        if (widget.Send(swipe).compare(0, 2, "OK") != 0)
+            state.SkipWithError("swipe refused");
+        while (SlotCityName(widget.Send(dump), "centerLayout") != next && Seconds(start) < 10.0)
+            std::this_thread::sleep_for(std::chrono::milliseconds(2));
+        state.SetIterationTime(Seconds(start));
+        widget.Send("idle 10");
+    }
+}
+BENCHMARK(BM_FlickToSlotsRotated)->Unit(benchmark::kMillisecond)->Iterations(3)->UseManualTime();
+
 // Until the host answers, which it does once the instances named on its
 // command line exist with their pages.
 void BM_StartToFirstInstance(benchmark::State& state)
@@ -163,26 +257,44 @@ void BM_StartToFirstInstance(benchmark::State& state)
         Widget widget({"4x4"});
         widget.Send("list");
         state.SetIterationTime(Seconds(start));
+        state.counters["cpu_ms"] = CpuMs(widget.pid);
     }
 }
-BENCHMARK(BM_StartToFirstInstance)->Unit(benchmark::kMillisecond)->Iterations(10)->UseManualTime();
+BENCHMARK(BM_StartToFirstInstance)->Unit(benchmark::kMillisecond)->Iterations(1)->UseManualTime();
 
 void BM_StartToBareWindowDrawn(benchmark::State& state)
 {
     for (auto _ : state)
     {
         Clock::time_point start = Clock::now();
+        int in = -1;
         int out = -1;
-        pid_t pid = Spawn({BARE_WINDOW_PROGRAM}, nullptr, &out);
+        pid_t pid = Spawn({BARE_WINDOW_PROGRAM, "--stay"}, &in, &out);
         char buffer[16];
         if (read(out, buffer, sizeof(buffer)) <= 0)
             state.SkipWithError("bare window did not draw");
         state.SetIterationTime(Seconds(start));
+        state.counters["cpu_ms"] = CpuMs(pid);
+        close(in);
         close(out);
         waitpid(pid, nullptr, 0);
     }
 }
-BENCHMARK(BM_StartToBareWindowDrawn)->Unit(benchmark::kMillisecond)->Iterations(10)->UseManualTime();
+BENCHMARK(BM_StartToBareWindowDrawn)->Unit(benchmark::kMillisecond)->Iterations(1)->UseManualTime();
+
+// Two instances (4x2 and 4x4) over ten cities once settled, beside the bare
+// window.
+void BM_MemoryTwoInstances(benchmark::State& state)
+{
+    for (auto _ : state)
+    {
+        Memory bare = BareWindowMemory();
+        Widget widget({"4x2", "4x4"});
+        widget.Send("idle 10");
+        SetMemoryCounters(state, bare, ReadMemory(widget.pid));
+    }
+}
+BENCHMARK(BM_MemoryTwoInstances)->Unit(benchmark::kSecond)->Iterations(1);
 
 void BM_ResidentMemoryAfterFlicksAndUpdates(benchmark::State& state)
 {
@@ -190,16 +302,7 @@ void BM_ResidentMemoryAfterFlicksAndUpdates(benchmark::State& state)
     int flicks = flicksText ? atoi(flicksText) : 1000;
     for (auto _ : state)
     {
-        int in = -1;
-        int out = -1;
-        pid_t bare = Spawn({BARE_WINDOW_PROGRAM, "--stay"}, &in, &out);
-        char buffer[16];
-        (void)read(out, buffer, sizeof(buffer));
-        double bareKiB = ResidentKiB(bare);
-        close(in);
-        close(out);
-        waitpid(bare, nullptr, 0);
-
+        Memory bare = BareWindowMemory();
         Widget widget({"4x2", "4x4"});
         widget.Send("idle 10");
         std::string ids[] = {std::string(kWidgetId) + ":1", std::string(kWidgetId) + ":2"};
@@ -211,13 +314,10 @@ void BM_ResidentMemoryAfterFlicksAndUpdates(benchmark::State& state)
             widget.Send("update " + id);
             widget.Send("idle 10");
             if (i == flicks / 2)
-                halfwayKiB = ResidentKiB(widget.pid);
+                halfwayKiB = ReadMemory(widget.pid).rssKiB;
         }
-        double widgetKiB = ResidentKiB(widget.pid);
-        state.counters["bare_KiB"] = bareKiB;
-        state.counters["widget_KiB"] = widgetKiB;
-        state.counters["halfway_KiB"] = halfwayKiB;
-        state.counters["ratio"] = widgetKiB / bareKiB;
+        SetMemoryCounters(state, bare, ReadMemory(widget.pid));
+        state.counters["halfway_rss_KiB"] = halfwayKiB;
         state.counters["flicks"] = flicks;
     }
 }
