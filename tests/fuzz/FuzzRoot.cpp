@@ -8,24 +8,10 @@
 #include <stdexcept>
 #include <sys/stat.h>
 
+#include "SuiteFolders.h"
+
 namespace WeatherTest
 {
-
-namespace
-{
-const char* const kSuiteApps[] = {"com.quorvex.weather-m", "com.quorvex.weather-m-agent",
-                                  "com.quorvex.weather-m-widget"};
-
-void MakeDirs(const std::string& path)
-{
-    for (size_t pos = path.find('/', 1);; pos = path.find('/', pos + 1))
-    {
-        mkdir(path.substr(0, pos).c_str(), 0700);
-        if (pos == std::string::npos)
-            break;
-    }
-}
-}  // namespace
 
 const FuzzRoot& FuzzRoot::Get()
 {
@@ -43,7 +29,7 @@ FuzzRoot::FuzzRoot()
     setenv("PLATFORM_ROOT", mPath.c_str(), 1);
     for (const char* app : kSuiteApps)
         for (const char* sub : {"/shared/data", "/shared/res", "/res"})
-            MakeDirs(mPath + "/apps/" + app + sub);
+            MakeDirs(mPath + "/apps/" + app + sub, 0700);
 }
 
 FuzzRoot::~FuzzRoot()

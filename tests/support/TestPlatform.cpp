@@ -7,24 +7,13 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include "SuiteFolders.h"
+
 namespace WeatherTest
 {
 
 namespace
 {
-const char* const kSuiteApps[] = {"com.quorvex.weather-m", "com.quorvex.weather-m-agent",
-                                  "com.quorvex.weather-m-widget"};
-
-void MakeDirs(const std::string& path)
-{
-    for (size_t pos = path.find('/', 1);; pos = path.find('/', pos + 1))
-    {
-        mkdir(path.substr(0, pos).c_str(), 0755);
-        if (pos == std::string::npos)
-            break;
-    }
-}
-
 int RemoveEntry(const char* path, const struct stat*, int, struct FTW*)
 {
     // Tests may leave read-only folders behind; make them removable.
@@ -77,9 +66,9 @@ std::string TestPlatformRoot::SharedDataDir() const
 void TestPlatformRoot::RegisterApp(const std::string& appId) const
 {
     std::string dir = Path("apps/" + appId);
-    MakeDirs(dir + "/shared/data");
-    MakeDirs(dir + "/shared/res");
-    MakeDirs(dir + "/res");
+    MakeDirs(dir + "/shared/data", 0755);
+    MakeDirs(dir + "/shared/res", 0755);
+    MakeDirs(dir + "/res", 0755);
 }
 
 void TestPlatformRoot::RegisterApp(const std::string& appId, const std::string& conf) const
