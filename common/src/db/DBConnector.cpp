@@ -44,14 +44,17 @@ bool DBConnector::DBOpen(const std::string& dbFilePath, bool isReadOnly)
     }
     COMMON_RETV_IF(dbFilePath.empty(), false);
     if (isReadOnly)
+    {
         RollBackHotJournal(dbFilePath);
-    if (isReadOnly)
         COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY) == false,
                        false);
+    }
     else
+    {
         COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READWRITE |
                                                   SQLITE_OPEN_CREATE) == false,
                        false);
+    }
     COMMON_RETV_IF(DBSetBusyHandler() == false, false);
     COMMON_RETV_IF(DBExcutePerformanceOptimization() == false, false);
     COMMON_RETV_IF(DBStartTransaction() == false, false);
