@@ -1,6 +1,6 @@
 // The suite's programs when something goes wrong under them: an agent
 // killed while it writes, a disk that fills up during a refresh, the
-// settings file removed while the widget runs.
+// settings file removed or the weather file unreadable while the widget runs.
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <dirent.h>
@@ -224,10 +224,10 @@ public:
     std::string mMount;
 };
 
-// Each agent is killed at a random moment of its writes: up to 15 ms after
-// it opened its first journal, which spans its ten cities, or it ends
-// first. A writer killed inside its transaction leaves a journal that the
-// next reader or writer must roll back.
+// Each agent is killed at a random moment of its writes, up to 15 ms after
+// it first opened the journal: inside the write of one of its ten cities or
+// between two (or it ends first). A writer killed inside its transaction
+// leaves a journal that the next reader or writer must roll back.
 TEST_F(FaultTest, AnAgentKilledWhileWritingLeavesNoHalfWrittenCity)
 {
     AddCities();
