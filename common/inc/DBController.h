@@ -30,10 +30,10 @@ public:
     int Initialize();
 
     // Cities in page order with all their forecasts; empty, not null, when
-    // there are none. Pages 0 to count - 1 are read and a missing page (a
-    // gap another writer left) is skipped, never a null entry, so a city's
-    // position may differ from its page index: callers pick the displayed
-    // city and its neighbours by position in this list, never by page index.
+    // there are none, and null when any read of them failed. Pages 0 to count - 1 are read and a missing page
+    // (a gap another writer left) is skipped, never a null entry, so a city's position may differ from its
+    // page index: callers pick the displayed city and its neighbours by position in this list, never by page
+    // index.
     CityPtrVectorPtr SelectAllCityData();
     CityPtr SelectCityData(int pageIndex);
     CityPtr SelectCityData(const std::string& locationID);

@@ -44,12 +44,17 @@ bool DBConnector::DBOpen(const std::string& dbFilePath, bool isReadOnly)
     }
     COMMON_RETV_IF(dbFilePath.empty(), false);
     if (isReadOnly)
+    {
+        RollBackHotJournal(dbFilePath);
         COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READONLY) == false,
                        false);
+    }
     else
+    {
         COMMON_RETV_IF(DBFileOpen(dbFilePath, SQLITE_OPEN_SHAREDCACHE | SQLITE_OPEN_READWRITE |
                                                   SQLITE_OPEN_CREATE) == false,
                        false);
+    }
     COMMON_RETV_IF(DBSetBusyHandler() == false, false);
     COMMON_RETV_IF(DBExcutePerformanceOptimization() == false, false);
     COMMON_RETV_IF(DBStartTransaction() == false, false);
@@ -154,6 +159,26 @@ bool DBConnector::DBFileOpen(const std::string& dbFilePath, int openFlags)
         return false;
     }
     return true;
+}
+
+// A writer killed inside its transaction leaves a hot journal, and only a
+// connection that may write can roll it back: until the next writer came,
+// every read-only cycle would fail and the readers would see no city at all.
+// A live writer's journal is not hot; SQLite then only reads.
+void DBConnector::RollBackHotJournal(const std::string& dbFilePath)
+{
+    if (access((dbFilePath + "-journal").c_str(), F_OK) != 0)
+        return;
+    sqlite3* handle = nullptr;
+    int rc = sqlite3_open_v2(dbFilePath.c_str(), &handle, SQLITE_OPEN_READWRITE, nullptr);
+    if (rc == SQLITE_OK)
+    {
+        sqlite3_busy_handler(handle, DBUtilBusyHandler, nullptr);
+        rc = sqlite3_exec(handle, "SELECT COUNT(*) FROM sqlite_master;", nullptr, nullptr, nullptr);
+    }
+    if (rc != SQLITE_OK)
+        COMMON_LOG("journal of %s not rolled back: rc [%d]", dbFilePath.c_str(), rc);
+    sqlite3_close_v2(handle);
 }
 
 bool DBConnector::DBSetBusyHandler()

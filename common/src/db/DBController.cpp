@@ -124,7 +124,11 @@ CityPtrVectorPtr DBController::SelectAllCityData()
     DBCycleCloser cycle(GetWeatherDBFilePath(), READ);
     COMMON_RETV_IF(cycle.GetIsOpened() == false, nullptr);
     CityDBController cityDBController;
-    return SelectAllCities(cityDBController);
+    CityPtrVectorPtr cityPtrVector = SelectAllCities(cityDBController);
+    // A read that failed part way would pass for fewer cities, or cities
+    // without their forecasts.
+    COMMON_RETV_IF(cycle.Close() == false, nullptr);
+    return cityPtrVector;
 }
 
 CityPtr DBController::SelectCityData(int pageIndex)

@@ -102,7 +102,7 @@ void ControlCommandHandler::Handle(const std::string& line, const ReplyCb& reply
         {"list", &ControlCommandHandler::List},         {"tap", &ControlCommandHandler::Tap},
         {"swipe", &ControlCommandHandler::Swipe},       {"snapshot", &ControlCommandHandler::Snapshot},
         {"dump", &ControlCommandHandler::Dump},         {"event", &ControlCommandHandler::Event},
-        {"exit", &ControlCommandHandler::Exit},
+        {"exit", &ControlCommandHandler::Exit},         {"count", &ControlCommandHandler::Count},
     };
     Words words = Split(line);
     const std::string command = words.empty() ? std::string() : words[0];
@@ -247,6 +247,17 @@ std::string ControlCommandHandler::Dump(const Words& words)
     if (!instance)
         return error;
     return "OK " + mDumper.Dump(instance->GetWindowCanvas());
+}
+
+std::string ControlCommandHandler::Count(const Words& words)
+{
+    if (words.size() != 2)
+        return "ERR usage: count <id>";
+    std::string error;
+    WidgetInstance* instance = FindDrawn(words, error);
+    if (!instance)
+        return error;
+    return "OK " + std::to_string(ObjectTreeDumper::Count(instance->GetWindowCanvas()));
 }
 
 std::string ControlCommandHandler::Event(const Words& words)

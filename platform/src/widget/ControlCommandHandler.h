@@ -47,6 +47,7 @@ private:
     std::string Swipe(const Words& words);
     std::string Snapshot(const Words& words);
     std::string Dump(const Words& words);
+    std::string Count(const Words& words);
     std::string Event(const Words& words);
     void Idle(const Words& words, const ReplyCb& reply);
     // The instance named by words[1] with a window, or null with `error` set.

@@ -106,6 +106,26 @@ std::string ObjectTreeDumper::Dump(Evas* canvas)
     return "{" + Field("objects", "[" + Join(objects) + "]") + "}";
 }
 
+long ObjectTreeDumper::Count(Evas* canvas)
+{
+    long count = 0;
+    for (Evas_Object* object = canvas ? evas_object_bottom_get(canvas) : nullptr; object;
+         object = evas_object_above_get(object))
+        count += CountObject(object, 0);
+    return count;
+}
+
+long ObjectTreeDumper::CountObject(Evas_Object* object, int depth)
+{
+    long count = 1;
+    if (depth > kMaxDepth || !efl_isa(object, efl_canvas_group_class_get()))
+        return count;
+    Eina_List* members = evas_object_smart_members_get(object);
+    void* item = nullptr;
+    EINA_LIST_FREE(members, item) count += CountObject(static_cast<Evas_Object*>(item), depth + 1);
+    return count;
+}
+
 std::string ObjectTreeDumper::DumpObject(Evas_Object* object, int depth)
 {
     if (!object || depth > kMaxDepth)

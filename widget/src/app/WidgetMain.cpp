@@ -45,7 +45,10 @@ void WidgetMain::LoadAllWeatherInformation()
     mSettingPtr = settingDBController.Select();
     WIDGET_RET_IF(!mSettingPtr);
     NSWeather::DBController dbController;
-    mWeatherInfo = dbController.SelectAllCityData();
+    NSWeather::CityPtrVectorPtr cityPtrVector = dbController.SelectAllCityData();
+    // A failed read keeps the cities last read rather than none.
+    WIDGET_RET_IF(!cityPtrVector);
+    mWeatherInfo = cityPtrVector;
     mLastRefreshedTime = mSettingPtr->GetLastRefreshedTime();
 }
 

@@ -60,7 +60,12 @@ void WidgetViewController::Resume(bool force)
     if (refreshedTime != mWidgetViewDataPtr->GetLastRefreshedTime())
     {
         NSWeather::DBController dbController;
-        mWidgetViewDataPtr->SetCityPtrVector(dbController.SelectAllCityData());
+        NSWeather::CityPtrVectorPtr cityPtrVector = dbController.SelectAllCityData();
+        // A failed read leaves the pages as they are; the next resume reads again.
+        if (cityPtrVector)
+            mWidgetViewDataPtr->SetCityPtrVector(cityPtrVector);
+        else
+            refreshedTime = mWidgetViewDataPtr->GetLastRefreshedTime();
     }
     mWidgetViewDataPtr->SetSettingPtr(settingPtr);
     mWidgetViewPtr->Resume(force);

@@ -48,6 +48,7 @@ private:
     DBConnector& operator=(const DBConnector&) = delete;
 
     bool DBFileOpen(const std::string& dbFilePath, int openFlags);
+    static void RollBackHotJournal(const std::string& dbFilePath);
     bool DBSetBusyHandler();
     bool DBExcutePerformanceOptimization();
     bool DBOpen(const std::string& dbFilePath, bool isReadOnly);

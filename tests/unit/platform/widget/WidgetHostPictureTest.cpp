@@ -105,4 +105,22 @@ TEST_F(WidgetHostTest, DumpDescribesTheTextsOfTheWindow)
     EXPECT_THAT(Send("dump"), HasSubstr("ERR usage"));
 }
 
+// The count takes in what the dump leaves out (rectangles, clippers), so
+// it is larger than the dump's objects, and a second instance has its own.
+TEST_F(WidgetHostTest, CountTakesEveryObjectOfTheInstanceCanvas)
+{
+    StartHost();
+    std::string id = CreateInstance("4x2");
+    std::string reply = Send("count " + id);
+    ASSERT_EQ(reply.compare(0, 3, "OK "), 0) << reply;
+    std::string dump = Send("dump " + id);
+    size_t described = 0;
+    for (size_t at = dump.find("\"type\":"); at != std::string::npos; at = dump.find("\"type\":", at + 1))
+        ++described;
+    EXPECT_GT(std::stol(reply.substr(3)), static_cast<long>(described));
+    EXPECT_EQ(Send("count " + CreateInstance("4x2")), reply);
+    EXPECT_THAT(Send("count"), HasSubstr("ERR usage"));
+    EXPECT_THAT(Send("count nobody"), HasSubstr("ERR"));
+}
+
 }  // namespace WeatherTest
