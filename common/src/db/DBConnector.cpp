@@ -170,7 +170,8 @@ void DBConnector::RollBackHotJournal(const std::string& dbFilePath)
     if (access((dbFilePath + "-journal").c_str(), F_OK) != 0)
         return;
     sqlite3* handle = nullptr;
-    int rc = sqlite3_open_v2(dbFilePath.c_str(), &handle, SQLITE_OPEN_READWRITE, nullptr);
+    int rc =
+        sqlite3_open_v2(dbFilePath.c_str(), &handle, SQLITE_OPEN_READWRITE | SQLITE_OPEN_NOFOLLOW, nullptr);
     if (rc == SQLITE_OK)
     {
         sqlite3_busy_handler(handle, DBUtilBusyHandler, nullptr);
