@@ -125,10 +125,14 @@ void ControlCommandHandler::Handle(const std::string& line, const ReplyCb& reply
 
 std::string ControlCommandHandler::Create(const Words& words)
 {
-    if (words.size() != 2 || SizeTypeFromName(words[1]) < 0)
-        return "ERR usage: create <4x2|4x4>";
+    bool withWindow = words.size() == 2;
+    if ((words.size() != 2 && (words.size() != 3 || words[2] != "nowindow")) ||
+        SizeTypeFromName(words[1]) < 0)
+        return "ERR usage: create <4x2|4x4> [nowindow]";
     std::string id;
-    int result = mHost.CreateInstance(SizeTypeFromName(words[1]), id);
+    int result = mHost.CreateInstance(SizeTypeFromName(words[1]), id, withWindow);
+    if (!withWindow && mHost.FindInstance(id))
+        return "OK " + id + " " + std::to_string(result);
     return result == 0 ? "OK " + id : Result("create", result);
 }
 

@@ -208,7 +208,7 @@ int WidgetHost::Exit()
     return WIDGET_ERROR_NONE;
 }
 
-int WidgetHost::CreateInstance(int sizeType, std::string& id)
+int WidgetHost::CreateInstance(int sizeType, std::string& id, bool withWindow)
 {
     int width = 0;
     int height = 0;
@@ -217,9 +217,15 @@ int WidgetHost::CreateInstance(int sizeType, std::string& id)
     id = mWidgetId + ":" + std::to_string(mNextInstanceNumber++);
     mInstances.push_back(std::make_unique<WidgetInstance>(id, sizeType, width, height));
     WidgetInstance* instance = mInstances.back().get();
+    instance->SetIsWindowWithheld(!withWindow);
     const auto& cb = mClass->callbacks;
     int result =
         cb.create ? cb.create(instance, nullptr, width, height, mClass->userData) : WIDGET_ERROR_NONE;
+    if (!withWindow)
+    {
+        dlog_print(DLOG_INFO, kLogTag, "create of %s without a window returned %d", id.c_str(), result);
+        return result;
+    }
     if (result != WIDGET_ERROR_NONE)
     {
         dlog_print(DLOG_ERROR, kLogTag, "create of %s failed (%d); removed", id.c_str(), result);
@@ -240,9 +246,14 @@ int WidgetHost::ResizeInstance(const std::string& id, int sizeType)
         return WIDGET_ERROR_NOT_EXIST;
     if (widget_service_get_size(static_cast<widget_size_type_e>(sizeType), &width, &height) != 0)
         return WIDGET_ERROR_INVALID_PARAMETER;
+    bool isFirstLayout = instance->GetIsWindowWithheld();
+    instance->SetIsWindowWithheld(false);
     instance->SetSize(sizeType, width, height);
     const auto& cb = mClass->callbacks;
-    return cb.resize ? cb.resize(instance, width, height, mClass->userData) : WIDGET_ERROR_NONE;
+    int result = cb.resize ? cb.resize(instance, width, height, mClass->userData) : WIDGET_ERROR_NONE;
+    if (isFirstLayout && FindInstance(id))
+        ResumeInstance(id);
+    return result;
 }
 
 int WidgetHost::PauseInstance(const std::string& id)

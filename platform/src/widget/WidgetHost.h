@@ -35,8 +35,10 @@ public:
     const std::string& GetWidgetId() const { return mWidgetId; }
 
     // Lifecycle as driven by a home screen. Create does create, resize and
-    // resume; the id of the new instance goes to `id`.
-    int CreateInstance(int sizeType, std::string& id);
+    // resume; the id of the new instance goes to `id`. Without a window the
+    // instance has no parent object until its first resize, which then also
+    // resumes it; it stays even when the create callback fails for that.
+    int CreateInstance(int sizeType, std::string& id, bool withWindow = true);
     int ResizeInstance(const std::string& id, int sizeType);
     int PauseInstance(const std::string& id);
     int ResumeInstance(const std::string& id);

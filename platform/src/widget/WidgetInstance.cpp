@@ -81,6 +81,8 @@ void WidgetInstance::SetSize(int sizeType, int width, int height)
 
 Evas_Object* WidgetInstance::GetParentObject()
 {
+    if (mIsWindowWithheld)
+        return nullptr;
     if (mParentObject)
         return mParentObject;
     // The rectangle only carries the canvas to the window; it is never drawn.

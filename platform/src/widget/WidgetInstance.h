@@ -62,7 +62,11 @@ public:
 
     // The transparent parent rectangle (owned by its canvas, which the
     // instance owns); made again when the widget deleted the last one.
+    // None while the window is withheld: a home screen that has not laid
+    // the instance out yet.
     Evas_Object* GetParentObject();
+    bool GetIsWindowWithheld() const { return mIsWindowWithheld; }
+    void SetIsWindowWithheld(bool withheld) { mIsWindowWithheld = withheld; }
     bool OwnsCanvas(const Evas* canvas) const;
 
     // Makes the instance's window; null when it already has one.
@@ -86,6 +90,7 @@ private:
     std::string mContentInfo;
     void* mTag = nullptr;
     bool mIsUpdatePending = false;
+    bool mIsWindowWithheld = false;
     bundle* mPendingContent = nullptr;
     Ecore_Evas* mParentCanvas = nullptr;
     Evas_Object* mParentObject = nullptr;

@@ -30,7 +30,7 @@ void PrintUsage(FILE* out)
     fprintf(out,
             "usage: widgetctl [--widget-id ID] <command> [args]\n"
             "       widgetctl --help\n"
-            "commands: create <4x2|4x4> | resize <id> <4x2|4x4> | pause <id> | resume <id>\n"
+            "commands: create <4x2|4x4> [nowindow] | resize <id> <4x2|4x4> | pause <id> | resume <id>\n"
             "  | update <id> [force] | destroy <id> | list | tap <id> <x> <y> [ms]\n"
             "  | swipe <id> <x1> <y1> <x2> <y2> <ms> | snapshot <id> <file.png> | dump <id>\n"
             "  | count <id> | idle [seconds] | event <language|region|low-battery|low-memory> | exit\n");

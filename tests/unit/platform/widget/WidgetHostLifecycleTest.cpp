@@ -84,7 +84,8 @@ TEST_F(WidgetHostTest, UnknownIdsAndBadCommandsAreRefused)
         EXPECT_EQ(Send("tap " + bad + " 1 1"), "ERR unknown instance " + bad);
         EXPECT_EQ(Send("snapshot " + bad + " /tmp/x.png"), "ERR unknown instance " + bad);
     }
-    EXPECT_THAT(Send("create 3x3"), HasSubstr("ERR usage"));
+    for (const char* bad : {"create 3x3", "create 4x2 window", "create 4x2 nowindow 1"})
+        EXPECT_THAT(Send(bad), HasSubstr("ERR usage")) << bad;
     EXPECT_THAT(Send("resize " + id + " 4x3"), HasSubstr("ERR usage"));
     EXPECT_THAT(Send("tap " + id + " 1x 2"), HasSubstr("ERR usage"));
     EXPECT_THAT(Send("idle -1"), HasSubstr("ERR usage"));

@@ -7,6 +7,7 @@
 #include <sys/wait.h>
 #include <unistd.h>
 #include <vconf.h>
+#include <widget_errno.h>
 
 #include <chrono>
 #include <thread>
@@ -100,6 +101,19 @@ TEST_F(WidgetAppTest, InstancesLiveAndDieOnTheirOwn)
         EXPECT_EQ(Send("resize " + Id(2) + " " + size), "OK");
         EXPECT_NE(CentreText(Id(2), "name"), "") << size;
     }
+}
+
+TEST_F(WidgetAppTest, AnInstanceWithoutAWindowGetsItsViewOnTheFirstResize)
+{
+    WriteCities(2);
+    StartHost({"4x2"});
+    EXPECT_EQ(Send("create 4x4 nowindow"), "OK " + Id(2) + " " + std::to_string(WIDGET_ERROR_FAULT));
+    EXPECT_THAT(Send("list"), HasSubstr("OK 2"));
+    EXPECT_EQ(CountLog("WidgetView Created"), 1);
+    EXPECT_EQ(Send("resize " + Id(2) + " 4x4"), "OK");
+    WaitIdle();
+    EXPECT_EQ(CountLog("WidgetView Created"), 2);
+    EXPECT_NE(CentreText(Id(2), "name"), "");
 }
 
 TEST_F(WidgetAppTest, StaleDataStartsOneRefreshAfterASecondUnlessAPauseComesFirst)
