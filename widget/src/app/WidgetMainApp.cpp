@@ -23,9 +23,6 @@ const int kFeatureWidgetState = 2008;
 const int kFeatureWidgetAlive = 2009;
 const int kDetailWidgetEmpty = 13;
 const int kDetailWidgetAlive = 16;
-// Pages are rebuilt on every flick and update; Elementary's default cache
-// (4 MB a window) would keep every icon and background they ever decoded.
-const int kImageCacheKiB = 256;
 
 void LowBatteryCb(app_event_info_h, void*)
 {
@@ -52,7 +49,6 @@ widget_class_h WidgetMain::CreateWidget(void* pThis)
     }
     if (NSWeather::DataStoreInitializer::Run() != NSWeather::ERR_OK)
         WIDGET_LOG("dbController initialize failed");
-    elm_config_cache_image_cache_size_set(kImageCacheKiB);
     static_cast<WidgetMain*>(pThis)->RegisterListeners();
     widget_instance_lifecycle_callback_s callbacks = {CreateWidgetInstance, DestroyWidgetInstance,
                                                       PauseWidgetInstance,  ResumeWidgetInstance,

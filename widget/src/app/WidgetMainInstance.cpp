@@ -21,6 +21,7 @@ namespace
 {
 const int kErrorInvalid = -22;
 const double kAppBaseScale = 2.6;
+const int kImageCacheKiB = 256;
 const int kFeatureWidgetState = 2008;
 
 int AddedWidgetDetail(int type)
@@ -93,6 +94,11 @@ int WidgetMain::CreateOrResizeView(const WidgetViewControllerPtr& controller, wi
         widget_set_extra_info(widget_app_get_id(context), NULL, dgettext("weather-m", "IDS_DB_TAB_WEATHER"),
                               NULL, NULL);
         WIDGET_LOG("WidgetView Created");
+        // Pages are rebuilt on every flick and update; Elementary's default
+        // cache (4 MB a window) would keep every image they ever decoded.
+        // Set here, after the window: the setter flushes every cache, and
+        // before the first window that made it read the theme file again.
+        elm_config_cache_image_cache_size_set(kImageCacheKiB);
     }
     else if (controller->GetSizeType() != type)
     {
