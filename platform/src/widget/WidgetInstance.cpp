@@ -2,8 +2,6 @@
 
 #include <Elementary.h>
 
-#include <cstring>
-
 #include "core/ApiGuard.h"
 #include "dlog.h"
 #include "widget/WidgetHost.h"
@@ -119,10 +117,6 @@ Evas_Object* WidgetInstance::CreateWindow(const char* name)
         return nullptr;
     }
     elm_win_title_set(mWindow, mId.c_str());
-    // Off screen there is no window manager; the toolkit would draw its own frame.
-    const char* engine = ecore_evas_engine_name_get(ecore_evas_ecore_evas_get(evas_object_evas_get(mWindow)));
-    if (engine && strcmp(engine, "buffer") == 0)
-        elm_win_borderless_set(mWindow, EINA_TRUE);
     evas_object_resize(mWindow, mWidth, mHeight);
     evas_object_intercept_resize_callback_add(mWindow, WindowResizeCb, nullptr);
     evas_object_event_callback_add(mWindow, EVAS_CALLBACK_DEL, WindowDelCb, this);
