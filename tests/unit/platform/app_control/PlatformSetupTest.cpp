@@ -11,6 +11,7 @@
 #include <utility>
 #include <string>
 
+#include "TestFiles.h"
 #include "TestPlatform.h"
 
 namespace
@@ -103,6 +104,46 @@ TEST_F(PlatformSetupTest, RegisteredSuiteCanBeLaunched)
         std::string record = mRoot.Path(std::string("apps/") + appId + "/shared/data/launch-record.txt");
         for (int i = 0; i < 500 && access(record.c_str(), F_OK) != 0; ++i) usleep(10000);
         EXPECT_EQ(0, access(record.c_str(), F_OK)) << appId;
+    }
+}
+
+std::string RealPath(const std::string& path)
+{
+    char resolved[PATH_MAX];
+    return realpath(path.c_str(), resolved) ? resolved : "(missing) " + path;
+}
+
+TEST_F(PlatformSetupTest, InstalledCopyRegistersItsPrefixUnlessToldOtherwise)
+{
+    // A copy laid out as installed, with the agent beside it and not the app.
+    std::string bin = mRoot.Path("prefix/bin");
+    std::string res = bin + "/" PLATFORM_SETUP_RES_FROM_BIN;
+    std::string other = mRoot.Path("other-res");
+    const char* widgetRes = "/com.quorvex.weather-m-widget/res";
+    ASSERT_EQ(0, system(("mkdir -p '" + res + widgetRes + "' '" + other + widgetRes +
+                         "' && cp " PLATFORM_SETUP_PATH " '" + bin +
+                         "/platform-setup' && cp " LAUNCH_RECORDER_PATH " '" + bin + "/weather-agent'")
+                            .c_str()));
+    const std::string besideAgent = "exec=" + RealPath(bin + "/weather-agent") + "\n";
+    const struct
+    {
+        std::string options;
+        std::string widgetRes;
+        std::string agentConf;
+    } kCases[] = {{"", RealPath(res) + widgetRes, besideAgent},
+                  {"--agent /bin/sh", RealPath(res) + widgetRes, "exec=" + RealPath("/bin/sh") + "\n"},
+                  // Resources named on the command line bring no programs of the prefix.
+                  {"--res '" + other + "'", RealPath(other) + widgetRes, ""}};
+    int n = 0;
+    for (const auto& c : kCases)
+    {
+        SCOPED_TRACE(c.options);
+        std::string root = mRoot.Path("root" + std::to_string(++n));
+        ASSERT_EQ(
+            0, system((bin + "/platform-setup --root '" + root + "' " + c.options + " >/dev/null").c_str()));
+        EXPECT_EQ(c.widgetRes, RealPath(root + "/apps/com.quorvex.weather-m-widget/res"));
+        EXPECT_EQ(c.agentConf, WeatherTest::ReadText(root + "/apps/com.quorvex.weather-m-agent/app.conf"));
+        EXPECT_EQ("", WeatherTest::ReadText(root + "/apps/com.quorvex.weather-m/app.conf"));
     }
 }
 
