@@ -232,10 +232,18 @@ bool RegisterApp(const std::string& appId, const std::string& conf)
            (conf.empty() || platform::WriteFileAtomic(dir + "/app.conf", conf));
 }
 
-// "exec=<absolute program>\n"; empty when the path would break the line.
+// "exec=<absolute program>\n"; empty when it cannot run (a mistyped path
+// would register fine and fail only at the first launch) or the path would
+// break the line.
 std::string ExecLine(const std::string& program)
 {
     std::string path = Absolute(program);
+    struct stat st;
+    if (stat(path.c_str(), &st) != 0 || !S_ISREG(st.st_mode) || access(path.c_str(), X_OK) != 0)
+    {
+        fprintf(stderr, "platform-setup: %s is not a program that can run\n", path.c_str());
+        return std::string();
+    }
     if (path.find_first_of("\r\n") != std::string::npos)
     {
         fprintf(stderr, "platform-setup: %s contains a line break\n", path.c_str());

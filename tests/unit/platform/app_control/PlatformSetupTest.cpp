@@ -170,6 +170,10 @@ TEST_F(PlatformSetupTest, BadValuesAndLinkedFoldersAreRefused)
     // A line break would add a line of the caller's choosing to app.conf.
     EXPECT_EQ(2, RunSetup("--agent \"$(printf '/bin/true\\noperation=x')\""));
     EXPECT_EQ(2, RunSetup("--browser \"$(printf '/bin/true\\rview-uri=x')\""));
+    // A program that cannot run fails the setup instead of the first launch.
+    WeatherTest::WriteText(mRoot.Path("plain.txt"), "not a program");
+    for (const char* program : {"missing/agent", "plain.txt", "."})
+        EXPECT_EQ(1, RunSetup(std::string("--agent ") + mRoot.Path(program))) << program;
     EXPECT_NE(0, access(mRoot.Path("apps/com.quorvex.weather-m-agent/app.conf").c_str(), F_OK));
 
     std::string elsewhere = mRoot.Path("elsewhere");
