@@ -1,7 +1,8 @@
 # shellcheck shell=sh
 # Shell helpers shared by scripts/snapshots and scripts/demo: the build's
 # programs, a fresh platform root, and the widget host driven through
-# widgetctl. Source it, then call host_use_build with a built tree.
+# widgetctl. Source it, then call host_use_build with a built tree or
+# host_use_installed with the folder of the installed programs.
 
 widget_id=com.quorvex.weather-m-widget
 
@@ -14,6 +15,25 @@ host_use_build() {
     ctl=$build/platform/tools/widgetctl/widgetctl
     vconftool=$build/platform/tools/vconftool/vconftool
     setup=$build/platform/tools/platform-setup/platform-setup
+    res=$build/res
+    host_environment
+}
+
+# host_use_installed BIN_DIR: the same for the programs installed in
+# BIN_DIR; their platform-setup registers the resources installed with it.
+host_use_installed() {
+    bin=$(cd "$1" && pwd)
+    widget=$bin/weather-widget
+    agent=$bin/weather-agent
+    app=$bin/weather-app
+    ctl=$bin/widgetctl
+    vconftool=$bin/vconftool
+    setup=$bin/platform-setup
+    res=
+    host_environment
+}
+
+host_environment() {
     export ECORE_NO_SYSTEM_MODULES=1 EINA_LOG_BACKTRACE=0 EINA_LOG_LEVELS=ecore_con:0
     export PLATFORM_APP_ID=$widget_id
 }
@@ -26,12 +46,15 @@ host_missing_programs() {
 }
 
 # host_new_root DIR [platform-setup options]: DIR becomes PLATFORM_ROOT,
-# with a fresh phone's keys and the build's resources.
+# with a fresh phone's keys and the resources of the programs in use.
 host_new_root() {
     PLATFORM_ROOT=$1
     export PLATFORM_ROOT
     shift
-    "$setup" --root "$PLATFORM_ROOT" --res "$build/res" "$@" > /dev/null
+    if [ -n "$res" ]; then
+        set -- --res "$res" "$@"
+    fi
+    "$setup" --root "$PLATFORM_ROOT" "$@" > /dev/null
 }
 
 # host_start LOG SIZE...: starts the widget with one instance per size,

@@ -10,6 +10,7 @@
 #include <cstring>
 #include <fstream>
 #include <map>
+#include <utility>
 #include <string>
 
 #include "app_control.h"
@@ -34,8 +35,9 @@ void Usage(FILE* out)
     fprintf(
         out,
         "usage: platform-setup [--help] [--root DIR] [--app PROGRAM] [--agent PROGRAM] [--widget PROGRAM]\n"
-        "                      [--res BUILD_RES_DIR] [--browser PROGRAM] [--reset]\n"
-        "Keys that exist are kept unless --reset is given.\n");
+        "                      [--res RES_DIR] [--browser PROGRAM] [--reset]\n"
+        "Keys that exist are kept unless --reset is given. Without --res, an installed\n"
+        "platform-setup registers the resources and programs installed with it.\n");
 }
 
 bool ParseOptions(int argc, char** argv, Options& options)
@@ -95,6 +97,45 @@ std::string Absolute(const std::string& path)
 {
     char resolved[PATH_MAX];
     return realpath(path.c_str(), resolved) ? std::string(resolved) : path;
+}
+
+bool IsDir(const std::string& path)
+{
+    struct stat st;
+    return stat(path.c_str(), &st) == 0 && S_ISDIR(st.st_mode);
+}
+
+// The folder this program runs from; empty when the kernel cannot say.
+std::string OwnProgramDir()
+{
+    char path[PATH_MAX];
+    ssize_t n = readlink("/proc/self/exe", path, sizeof(path) - 1);
+    if (n <= 0)
+        return std::string();
+    std::string self(path, static_cast<size_t>(n));
+    return self.substr(0, self.rfind('/'));
+}
+
+// Installed, the prefix's own resources and programs serve unless --res
+// names others; found from this program so that the prefix can move. In a
+// build tree the folder is not there and nothing changes.
+void UseInstalledSuite(Options& options)
+{
+    std::string bin = OwnProgramDir();
+    std::string res = bin + "/" WEATHER_SETUP_RES_FROM_BIN;
+    if (!options.resDir.empty() || bin.empty() || !IsDir(res))
+        return;
+    options.resDir = Absolute(res);
+    const std::pair<const char*, const char*> kPrograms[] = {
+        {"com.quorvex.weather-m", "weather-app"},
+        {"com.quorvex.weather-m-agent", "weather-agent"},
+        {"com.quorvex.weather-m-widget", "weather-widget"}};
+    for (const auto& [appId, name] : kPrograms)
+    {
+        std::string program = bin + "/" + name;
+        if (options.programs.count(appId) == 0 && access(program.c_str(), X_OK) == 0)
+            options.programs[appId] = program;
+    }
 }
 
 // "Europe/Berlin" from TZ, /etc/localtime or /etc/timezone; "UTC" if none.
@@ -191,10 +232,18 @@ bool RegisterApp(const std::string& appId, const std::string& conf)
            (conf.empty() || platform::WriteFileAtomic(dir + "/app.conf", conf));
 }
 
-// "exec=<absolute program>\n"; empty when the path would break the line.
+// "exec=<absolute program>\n"; empty when it cannot run (a mistyped path
+// would register fine and fail only at the first launch) or the path would
+// break the line.
 std::string ExecLine(const std::string& program)
 {
     std::string path = Absolute(program);
+    struct stat st;
+    if (stat(path.c_str(), &st) != 0 || !S_ISREG(st.st_mode) || access(path.c_str(), X_OK) != 0)
+    {
+        fprintf(stderr, "platform-setup: %s is not a program that can run\n", path.c_str());
+        return std::string();
+    }
     if (path.find_first_of("\r\n") != std::string::npos)
     {
         fprintf(stderr, "platform-setup: %s contains a line break\n", path.c_str());
@@ -250,6 +299,7 @@ int main(int argc, char** argv)
         Usage(stdout);
         return 0;
     }
+    UseInstalledSuite(options);
     std::string root = platform::RootDir();
     std::string why;
     if (!platform::CheckRoot(why))

@@ -11,6 +11,7 @@
 #include <utility>
 #include <string>
 
+#include "TestFiles.h"
 #include "TestPlatform.h"
 
 namespace
@@ -106,6 +107,46 @@ TEST_F(PlatformSetupTest, RegisteredSuiteCanBeLaunched)
     }
 }
 
+std::string RealPath(const std::string& path)
+{
+    char resolved[PATH_MAX];
+    return realpath(path.c_str(), resolved) ? resolved : "(missing) " + path;
+}
+
+TEST_F(PlatformSetupTest, InstalledCopyRegistersItsPrefixUnlessToldOtherwise)
+{
+    // A copy laid out as installed, with the agent beside it and not the app.
+    std::string bin = mRoot.Path("prefix/bin");
+    std::string res = bin + "/" PLATFORM_SETUP_RES_FROM_BIN;
+    std::string other = mRoot.Path("other-res");
+    const char* widgetRes = "/com.quorvex.weather-m-widget/res";
+    ASSERT_EQ(0, system(("mkdir -p '" + res + widgetRes + "' '" + other + widgetRes +
+                         "' && cp " PLATFORM_SETUP_PATH " '" + bin +
+                         "/platform-setup' && cp " LAUNCH_RECORDER_PATH " '" + bin + "/weather-agent'")
+                            .c_str()));
+    const std::string besideAgent = "exec=" + RealPath(bin + "/weather-agent") + "\n";
+    const struct
+    {
+        std::string options;
+        std::string widgetRes;
+        std::string agentConf;
+    } kCases[] = {{"", RealPath(res) + widgetRes, besideAgent},
+                  {"--agent /bin/sh", RealPath(res) + widgetRes, "exec=" + RealPath("/bin/sh") + "\n"},
+                  // Resources named on the command line bring no programs of the prefix.
+                  {"--res '" + other + "'", RealPath(other) + widgetRes, ""}};
+    int n = 0;
+    for (const auto& c : kCases)
+    {
+        SCOPED_TRACE(c.options);
+        std::string root = mRoot.Path("root" + std::to_string(++n));
+        ASSERT_EQ(
+            0, system((bin + "/platform-setup --root '" + root + "' " + c.options + " >/dev/null").c_str()));
+        EXPECT_EQ(c.widgetRes, RealPath(root + "/apps/com.quorvex.weather-m-widget/res"));
+        EXPECT_EQ(c.agentConf, WeatherTest::ReadText(root + "/apps/com.quorvex.weather-m-agent/app.conf"));
+        EXPECT_EQ("", WeatherTest::ReadText(root + "/apps/com.quorvex.weather-m/app.conf"));
+    }
+}
+
 TEST_F(PlatformSetupTest, FreshRootIsOwnerOnly)
 {
     std::string root = mRoot.Path("fresh");
@@ -129,6 +170,10 @@ TEST_F(PlatformSetupTest, BadValuesAndLinkedFoldersAreRefused)
     // A line break would add a line of the caller's choosing to app.conf.
     EXPECT_EQ(2, RunSetup("--agent \"$(printf '/bin/true\\noperation=x')\""));
     EXPECT_EQ(2, RunSetup("--browser \"$(printf '/bin/true\\rview-uri=x')\""));
+    // A program that cannot run fails the setup instead of the first launch.
+    WeatherTest::WriteText(mRoot.Path("plain.txt"), "not a program");
+    for (const char* program : {"missing/agent", "plain.txt", "."})
+        EXPECT_EQ(1, RunSetup(std::string("--agent ") + mRoot.Path(program))) << program;
     EXPECT_NE(0, access(mRoot.Path("apps/com.quorvex.weather-m-agent/app.conf").c_str(), F_OK));
 
     std::string elsewhere = mRoot.Path("elsewhere");
