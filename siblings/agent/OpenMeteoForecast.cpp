@@ -46,6 +46,7 @@ struct HourlySeries
     Series isDay;
     Series precipitation;
     Series probability;
+    Series uvIndex;
 };
 
 struct DailySeries
@@ -214,8 +215,7 @@ bool ReadCurrent(const Json& root, time_t now, OpenMeteoForecast::Current& curre
                   ReadRequired(block, name, "is_day", FLAG, isDay, reason) &&
                   ReadRequired(block, name, "weather_code", CODE, code, reason) &&
                   ReadOptional(block, name, "wind_speed_10m", AMOUNT, current.windSpeed, reason) &&
-                  ReadOptional(block, name, "wind_direction_10m", DEGREES, current.windDirection, reason) &&
-                  ReadOptional(block, name, "uv_index", AMOUNT, current.uvIndex, reason);
+                  ReadOptional(block, name, "wind_direction_10m", DEGREES, current.windDirection, reason);
     if (!isRead)
         return false;
     current.time = static_cast<time_t>(time);
@@ -244,7 +244,9 @@ bool ReadHourly(const Json& root, HourlySeries& series, std::string& reason)
            ReadSeries(*block, name, "weather_code", count, CODE, series.code, reason) &&
            ReadSeries(*block, name, "is_day", count, FLAG, series.isDay, reason) &&
            ReadSeries(*block, name, "precipitation", count, AMOUNT, series.precipitation, reason) &&
-           ReadSeries(*block, name, "precipitation_probability", count, PERCENT, series.probability, reason);
+           ReadSeries(*block, name, "precipitation_probability", count, PERCENT, series.probability,
+                      reason) &&
+           ReadSeries(*block, name, "uv_index", count, AMOUNT, series.uvIndex, reason);
 }
 
 bool SelectHours(const HourlySeries& series, time_t now, std::vector<OpenMeteoForecast::Hour>& hours,
@@ -333,6 +335,15 @@ bool ReadDaily(const Json& root, std::vector<OpenMeteoForecast::Day>& days, std:
     return true;
 }
 
+// The UV index of the hour the current conditions fall in.
+std::optional<double> UvIndexAt(const HourlySeries& series, time_t time)
+{
+    for (size_t i = 0; i < series.time.size(); ++i)
+        if (*series.time[i] <= time && time < *series.time[i] + HOUR)
+            return series.uvIndex[i];
+    return std::nullopt;
+}
+
 // Tonight's precipitation from the hours between the first sunset and the
 // next sunrise; empty when the answer does not say.
 OpenMeteoForecast::Night NightOf(const HourlySeries& series, const std::vector<OpenMeteoForecast::Day>& days)
@@ -370,6 +381,7 @@ bool OpenMeteoForecast::Parse(const std::string& text, time_t now, OpenMeteoFore
         !SelectHours(hourly, now, parsed.mHours, reason) || !ReadDaily(root, parsed.mDays, reason))
         return false;
     parsed.mTonight = NightOf(hourly, parsed.mDays);
+    parsed.mCurrent.uvIndex = UvIndexAt(hourly, parsed.mCurrent.time);
     forecast = std::move(parsed);
     return true;
 }

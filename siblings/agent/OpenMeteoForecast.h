@@ -28,7 +28,7 @@ public:
         int code = 0;
         std::optional<double> windSpeed;  // km/h
         std::optional<double> windDirection;
-        std::optional<double> uvIndex;
+        std::optional<double> uvIndex;  // of the hour it falls in
     };
 
     struct Hour

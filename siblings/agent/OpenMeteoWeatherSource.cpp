@@ -28,9 +28,9 @@ const char* const USER_AGENT =
     "weather-widget/" WEATHER_VERSION " weather-agent (com.quorvex.weather-m-agent)";
 const char* const CURRENT_FIELDS =
     "temperature_2m,relative_humidity_2m,apparent_temperature,is_day,weather_code,wind_speed_10m,"
-    "wind_direction_10m,uv_index";
+    "wind_direction_10m";
 const char* const HOURLY_FIELDS =
-    "temperature_2m,weather_code,is_day,precipitation,precipitation_probability";
+    "temperature_2m,weather_code,is_day,precipitation,precipitation_probability,uv_index";
 const char* const DAILY_FIELDS =
     "weather_code,temperature_2m_max,temperature_2m_min,sunrise,sunset,precipitation_sum,"
     "precipitation_probability_max";

@@ -136,7 +136,7 @@ const RowCheck GOOD_ROWS[] = {
     {"SELECT humidity||'|'||sunriseTime||'|'||sunsetTime||'|'||uvIndex||'|'||realfeel||'|'||precType||'|'||"
      "precProbability||'|'||precAmount||'|'||precProbabilityNight||'|'||precAmountNight||'|'||aqi "
      "FROM EXTRA_WEATHER_TABLE",
-     "48|1796596560|1796631300|2|1.8|0|20.0|0.0|70.0|1.9|999"},
+     "48|1796596560|1796631300|3|1.8|0|20.0|0.0|70.0|1.9|999"},
     {"SELECT COUNT(*) FROM MOON_PHASE_TABLE WHERE locationID = 'kr-seoul'", "7"},
     {"SELECT (SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE WHERE websiteUrl = 'https://open-meteo.com/') + "
      "(SELECT COUNT(*) FROM WEEKLY_WEATHER_TABLE WHERE websiteUrl = 'https://open-meteo.com/')",
