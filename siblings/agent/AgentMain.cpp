@@ -30,8 +30,9 @@ void Usage(FILE* out)
             "Sources:\n"
             "  sample      made up offline from season, latitude and time of day; not a forecast (default)\n"
             "  open-meteo  forecasts fetched over HTTPS from Open-Meteo; needs the network\n"
-            "Without --source the key %s (string) names the source, so agents that\n"
-            "the widget launches follow it too. %s and %s (milliseconds)\n"
+            "Without --source the key %s (string) names the source, so agents\n"
+            "that the widget launches follow it too. The environment variables\n"
+            "%s and %s (milliseconds)\n"
             "change the Open-Meteo address and time limit.\n"
             "\n"
             "%s.\n",
