@@ -4,6 +4,7 @@
 #include <cmath>
 
 #include "CityTimeZone.h"
+#include "MoonCalculator.h"
 #include "SunCalculator.h"
 
 namespace NSWeather
@@ -15,8 +16,6 @@ constexpr double PI = 3.14159265358979323846;
 constexpr time_t HOUR = 3600;
 constexpr time_t DAY = 86400;
 constexpr time_t FRONT_SPACING = 30 * HOUR;
-constexpr double SYNODIC_DAYS = 29.530588;
-constexpr time_t KNOWN_NEW_MOON = 947182440;  // 2000-01-06 18:14 UTC
 const char* const SAMPLE_URL = "https://weather.example/sample/";
 
 uint64_t Mix(uint64_t x)
@@ -73,13 +72,6 @@ time_t CivilMidnight(const CatalogueCity& place, time_t when)
     return when - intoDay;
 }
 
-const char* MoonPhaseText(double age)
-{
-    static const char* const names[] = {"New Moon",  "Waxing Crescent", "First Quarter", "Waxing Gibbous",
-                                        "Full Moon", "Waning Gibbous",  "Last Quarter",  "Waning Crescent"};
-    int index = static_cast<int>(std::floor(age / SYNODIC_DAYS * 8.0 + 0.5)) % 8;
-    return names[index];
-}
 }  // namespace
 
 std::string SampleWeatherSource::GetDescription() const
@@ -252,36 +244,14 @@ void SampleWeatherSource::FillExtra(const CatalogueCity& place, time_t now, City
     city.SetExtraPtr(extraPtr);
 }
 
-void SampleWeatherSource::FillMoon(const CatalogueCity& place, time_t now, City& city)
-{
-    auto moonPhasePtrVector = std::make_shared<MoonPhasePtrVector>();
-    time_t midnight = SolarMidnight(place.GetLongitude(), now);
-    for (int i = 0; i < MOON_COUNT; ++i)
-    {
-        time_t day = midnight + i * DAY;
-        double age = std::fmod(static_cast<double>(day + 12 * HOUR - KNOWN_NEW_MOON) / DAY, SYNODIC_DAYS);
-        age = age < 0 ? age + SYNODIC_DAYS : age;
-        // The moon rises about 50 minutes later each day of its age.
-        time_t rise = day + 6 * HOUR + static_cast<time_t>(age / SYNODIC_DAYS * DAY);
-        auto moonPtr = std::make_shared<MoonPhase>();
-        moonPtr->SetLocationID(city.GetLocationId());
-        moonPtr->SetDate(day);
-        moonPtr->SetMoonRiseTime(rise);
-        moonPtr->SetMoonSetTime(rise + 12 * HOUR + 25 * 60);
-        moonPtr->SetPhaseText(MoonPhaseText(age));
-        moonPtr->SetAge(static_cast<int>(age));
-        moonPhasePtrVector->push_back(moonPtr);
-    }
-    city.SetMoonPhasePtrVector(moonPhasePtrVector);
-}
-
 bool SampleWeatherSource::Fill(const CatalogueCity& place, time_t now, int contentProvider, City& city)
 {
     FillCurrent(place, now, contentProvider, city);
     FillHourly(place, now, contentProvider, city);
     FillDaily(place, now, contentProvider, city);
     FillExtra(place, now, city);
-    FillMoon(place, now, city);
+    city.SetMoonPhasePtrVector(
+        MoonCalculator::MakePhases(city.GetLocationId(), place.GetLongitude(), now, MOON_COUNT));
     city.SetWebsiteUrl(SAMPLE_URL + place.GetId());
     return true;
 }

@@ -17,7 +17,7 @@ class SampleWeatherSource : public WeatherSource
 {
 public:
     static constexpr int HOURLY_COUNT = 24;
-    static constexpr int DAILY_COUNT = 7;
+    static constexpr int DAILY_COUNT = 10;
     static constexpr int MOON_COUNT = 7;
 
     bool Fill(const CatalogueCity& place, time_t now, int contentProvider, City& city) override;
@@ -43,7 +43,6 @@ private:
     static void FillHourly(const CatalogueCity& place, time_t now, int provider, City& city);
     static void FillDaily(const CatalogueCity& place, time_t now, int provider, City& city);
     static void FillExtra(const CatalogueCity& place, time_t now, City& city);
-    static void FillMoon(const CatalogueCity& place, time_t now, City& city);
 };
 
 }  // namespace NSWeather

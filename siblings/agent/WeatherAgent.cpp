@@ -100,22 +100,33 @@ CityPtr WeatherAgent::MakeCity(const CatalogueCity& place, bool isCurrentLocatio
     return cityPtr;
 }
 
-bool WeatherAgent::RefreshCity(const CityPtr& storedPtr, int contentProvider, time_t now)
+WeatherAgent::CityResult WeatherAgent::RefreshCity(const CityPtr& storedPtr, int contentProvider, time_t now)
 {
-    std::string id = CatalogueIdOf(storedPtr->GetLocationId());
-    CatalogueCityPtr placePtr = mCataloguePtr->FindById(id);
+    std::string locationId = storedPtr->GetLocationId();
+    const char* id = locationId.c_str();
+    CatalogueCityPtr placePtr = mCataloguePtr->FindById(CatalogueIdOf(locationId));
     if (!placePtr)
     {
-        SIBLING_LOG("city '%s' is not in the catalogue; left as it is", storedPtr->GetLocationId().c_str());
-        return false;
+        SIBLING_LOG("city '%s' is not in the catalogue; left as it is", id);
+        return CityResult::FAILED;
     }
     if (!HasForecastRows(*storedPtr))
     {
-        SIBLING_LOG("city '%s' has no forecast rows to update", storedPtr->GetLocationId().c_str());
-        return false;
+        SIBLING_LOG("city '%s' has no forecast rows to update", id);
+        return CityResult::FAILED;
+    }
+    if (mSourcePtr->IsFreshEnough(*storedPtr, now))
+    {
+        SIBLING_LOG("city '%s' was refreshed at %lld; kept without asking again", id,
+                    static_cast<long long>(storedPtr->GetRefreshedTime()));
+        return CityResult::RECENT;
     }
     CityPtr freshPtr = MakeCity(*placePtr, storedPtr->GetIsCurrentLocation(), contentProvider);
-    SIBLING_RETV_IF(!freshPtr, false);
+    if (!freshPtr)
+    {
+        SIBLING_LOG("city '%s' keeps its last weather", id);
+        return CityResult::FAILED;
+    }
     KeepIdentity(*storedPtr, *freshPtr);
     freshPtr->SetRefreshedTime(now);
     DBController dbController;
@@ -124,17 +135,17 @@ bool WeatherAgent::RefreshCity(const CityPtr& storedPtr, int contentProvider, ti
     freshPtr->SetPageIndex(-1);
     if (dbController.UpdateCityData(freshPtr) != ERR_OK)
     {
-        SIBLING_LOG("city '%s' could not be written", freshPtr->GetLocationId().c_str());
-        return false;
+        SIBLING_LOG("city '%s' could not be written", id);
+        return CityResult::FAILED;
     }
     freshPtr->SetPageIndex(-1);
-    SIBLING_RETV_IF(dbController.UpdateOnlyMoonPhaseData(freshPtr) != ERR_OK, false);
-    return true;
+    SIBLING_RETV_IF(dbController.UpdateOnlyMoonPhaseData(freshPtr) != ERR_OK, CityResult::FAILED);
+    return CityResult::FETCHED;
 }
 
 int WeatherAgent::RefreshAll()
 {
-    SIBLING_RETV_IF(!mCataloguePtr, ERR_FAIL);
+    SIBLING_RETV_IF(!mCataloguePtr || !mSourcePtr, ERR_FAIL);
     CityPtrVectorPtr cityPtrVector = DBController().SelectAllCityData();
     SIBLING_RETV_IF(!cityPtrVector, ERR_FAIL);
     if (cityPtrVector->empty())
@@ -144,15 +155,23 @@ int WeatherAgent::RefreshAll()
     }
     int contentProvider = ContentProvider::GetContentProvider();
     time_t now = Now();
-    size_t refreshed = 0;
+    size_t fetched = 0;
+    size_t recent = 0;
     for (const CityPtr& cityPtr : *cityPtrVector)
-        refreshed += (cityPtr && RefreshCity(cityPtr, contentProvider, now)) ? 1 : 0;
+    {
+        CityResult result = cityPtr ? RefreshCity(cityPtr, contentProvider, now) : CityResult::FAILED;
+        fetched += result == CityResult::FETCHED ? 1 : 0;
+        recent += result == CityResult::RECENT ? 1 : 0;
+    }
     if (DBController().DeleteUselessMoonPhaseData() != ERR_OK)
         SIBLING_LOG("old moon rows could not be removed");
-    SIBLING_LOG("refreshed %zu of %zu cities with sample weather", refreshed, cityPtrVector->size());
-    SIBLING_RETV_IF(refreshed == 0, ERR_FAIL);
-    SIBLING_RETV_IF(!MarkRefreshed(now, false), ERR_FAIL);
-    return refreshed == cityPtrVector->size() ? ERR_OK : ERR_FAIL;
+    SIBLING_LOG("refreshed %zu of %zu cities, %zu kept as recent enough", fetched, cityPtrVector->size(),
+                recent);
+    SIBLING_RETV_IF(fetched + recent == 0, ERR_FAIL);
+    // Nothing new came when every city was recent: the last time stays.
+    if (fetched > 0)
+        SIBLING_RETV_IF(!MarkRefreshed(now, false), ERR_FAIL);
+    return fetched + recent == cityPtrVector->size() ? ERR_OK : ERR_FAIL;
 }
 
 bool WeatherAgent::ReadPosition(double& latitude, double& longitude)

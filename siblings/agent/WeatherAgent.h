@@ -46,8 +46,15 @@ public:
     static int PostDone(const std::string& portId, const std::string& request, bool isDone);
 
 private:
+    enum class CityResult
+    {
+        FETCHED,
+        RECENT,  // the source's data is recent enough; not asked again
+        FAILED,  // logged; the city keeps its rows
+    };
+
     time_t Now() const;
-    bool RefreshCity(const CityPtr& storedPtr, int contentProvider, time_t now);
+    CityResult RefreshCity(const CityPtr& storedPtr, int contentProvider, time_t now);
     bool ReadPosition(double& latitude, double& longitude);
     bool StoreCurrentLocationCity(const CityPtr& cityPtr);
     bool MarkRefreshed(time_t now, bool isCurrentLocation);

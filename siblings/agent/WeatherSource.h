@@ -25,6 +25,14 @@ public:
     virtual bool Fill(const CatalogueCity& place, time_t now, int contentProvider, City& city) = 0;
     // Said in the agent's log and help.
     virtual std::string GetDescription() const = 0;
+    // True when the stored city's weather came from this source so lately
+    // that asking again would only load the service.
+    virtual bool IsFreshEnough(const City& stored, time_t now) const
+    {
+        (void)stored;
+        (void)now;
+        return false;
+    }
 };
 
 using WeatherSourcePtr = std::shared_ptr<WeatherSource>;

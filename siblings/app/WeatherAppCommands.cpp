@@ -80,7 +80,8 @@ std::string WeatherAppCommands::GetUsage()
            "  provider <code|name>   0 Accuweather, 1 cmaweather, 2 Kweather, 3 weathernews_kr, 4 "
            "WeatherNews\n"
            "  location on|off        use the current location (and agree to it)\n"
-           "Weather given with a new city is sample weather, not a forecast.\n";
+           "Weather given with a new city is sample weather, not a forecast; 'weather-agent --source\n"
+           "open-meteo refresh' fetches forecasts. Weather data by Open-Meteo.com, CC BY 4.0.\n";
 }
 
 int WeatherAppCommands::Run(const std::vector<std::string>& args, std::string& out)

@@ -1,5 +1,6 @@
 #include <bundle.h>
 #include <message_port.h>
+#include <vconf-keys.h>
 #include <vconf.h>
 
 #include <ctime>
@@ -9,6 +10,7 @@
 #include "ContentProvider.h"
 #include "FileUtil.h"
 #include "IconMappingTable.h"
+#include "LoopbackHttpServer.h"
 #include "MainLoop.h"
 #include "SampleWeatherSource.h"
 #include "SettingDBController.h"
@@ -18,6 +20,7 @@
 #include "WeatherAgent.h"
 #include "WeatherAppCommands.h"
 #include "WeatherDefine.h"
+#include "WeatherSourceChoice.h"
 
 using namespace NSWeather;
 using WeatherTest::RawDB;
@@ -92,7 +95,7 @@ protected:
         EXPECT_EQ(0, db.QueryInt("SELECT COUNT(*) FROM CITY_TABLE WHERE refreshedTime < " +
                                  std::to_string(refreshedSince)));
         const char* const counts[][2] = {
-            {"CURRENT_WEATHER_TABLE", "1"}, {"HOURLY_WEATHER_TABLE", "24"}, {"WEEKLY_WEATHER_TABLE", "7"},
+            {"CURRENT_WEATHER_TABLE", "1"}, {"HOURLY_WEATHER_TABLE", "24"}, {"WEEKLY_WEATHER_TABLE", "10"},
             {"EXTRA_WEATHER_TABLE", "1"},   {"MOON_PHASE_TABLE", "7"},
         };
         for (const auto& table : counts)
@@ -199,6 +202,59 @@ TEST_F(WeatherAgentTest, FailuresAreLoggedAndStillPost)
             db.Exec("ROLLBACK");
         EXPECT_EQ("FAIL", WaitForPost());
         EXPECT_NE(std::string::npos, AgentLog().find(c.logLine)) << AgentLog();
+    }
+}
+
+// A launched agent follows the source key: the service's error is logged,
+// the rows stay and the widget still hears back. --source wins over the key.
+TEST_F(WeatherAgentTest, LaunchedAgentFollowsTheSourceKeyAndStillPostsWhenTheServiceFails)
+{
+    AddCities({"seoul"});
+    SiblingTest::LoopbackHttpServer server;
+    server.SetAnswer({503, ""});
+    setenv(WeatherSourceChoice::BASE_URL_ENV, server.GetBaseUrl().c_str(), 1);
+    ASSERT_EQ(VCONF_OK, vconf_set_str(WeatherSourceChoice::SOURCE_KEY, WeatherSourceChoice::OPEN_METEO));
+    ASSERT_EQ(VCONF_OK, vconf_set_int(VCONFKEY_NETWORK_STATUS, VCONFKEY_NETWORK_WIFI));
+    const std::string rows = "SELECT group_concat(curTemperature||date) FROM CURRENT_WEATHER_TABLE";
+    std::string before = RawDB(DBPath(), true).QueryText(rows);
+
+    ASSERT_EQ(0, AppLauncher().RequestRefreshToAgent());
+    EXPECT_EQ("FAIL", WaitForPost()) << AgentLog();
+    EXPECT_EQ(1u, server.GetRequests().size());
+    EXPECT_NE(std::string::npos, AgentLog().find("Open-Meteo answered HTTP 503 for kr-seoul")) << AgentLog();
+    EXPECT_EQ(before, RawDB(DBPath(), true).QueryText(rows));
+
+    mResults.clear();
+    EXPECT_EQ(0, SiblingTest::Run({SiblingTest::AgentProgram(), "--source", "sample", "refresh"}));
+    EXPECT_EQ("OK", WaitForPost());
+    EXPECT_EQ(1u, server.GetRequests().size());
+    unsetenv(WeatherSourceChoice::BASE_URL_ENV);
+}
+
+struct UsageCase
+{
+    std::vector<std::string> args;
+    int exitCode;
+    const char* output;
+};
+
+const UsageCase USAGE_CASES[] = {
+    {{"--help"}, 0, "Weather data by Open-Meteo.com (https://open-meteo.com/), CC BY 4.0."},
+    {{"--source", "open-meteo", "--help"}, 0, "--source open-meteo|sample"},
+    {{"--source", "elsewhere", "refresh"}, 2, "usage: weather-agent"},
+    {{"--source"}, 2, "usage: weather-agent"},
+    {{"refresh", "locate"}, 2, "usage: weather-agent"},
+};
+
+TEST_F(WeatherAgentTest, HelpCreditsOpenMeteoAndBadUsageFails)
+{
+    std::string outputPath = mRoot.Path("usage.txt");
+    for (const UsageCase& c : USAGE_CASES)
+    {
+        std::vector<std::string> args = {SiblingTest::AgentProgram()};
+        args.insert(args.end(), c.args.begin(), c.args.end());
+        EXPECT_EQ(c.exitCode, SiblingTest::Run(args, outputPath)) << args.back();
+        EXPECT_NE(std::string::npos, WeatherTest::ReadText(outputPath).find(c.output)) << args.back();
     }
 }
 

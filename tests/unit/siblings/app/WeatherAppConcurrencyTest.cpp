@@ -5,6 +5,7 @@
 #include "TestDB.h"
 #include "TestFiles.h"
 #include "FileUtil.h"
+#include "SampleWeatherSource.h"
 
 using namespace NSWeather;
 
@@ -41,7 +42,8 @@ TEST_F(WeatherAppConcurrencyTest, RefreshWhileAddingLosesNoCity)
     EXPECT_EQ(count, db.QueryInt("SELECT COUNT(*) FROM CURRENT_WEATHER_TABLE"));
     EXPECT_EQ(count, db.QueryInt("SELECT COUNT(*) FROM EXTRA_WEATHER_TABLE"));
     EXPECT_EQ(count * 24, db.QueryInt("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE"));
-    EXPECT_EQ(count * 7, db.QueryInt("SELECT COUNT(*) FROM WEEKLY_WEATHER_TABLE"));
+    EXPECT_EQ(count * SampleWeatherSource::DAILY_COUNT,
+              db.QueryInt("SELECT COUNT(*) FROM WEEKLY_WEATHER_TABLE"));
     EXPECT_EQ(0,
               db.QueryInt("SELECT COUNT(*) FROM HOURLY_WEATHER_TABLE WHERE FK_ID NOT IN (SELECT PK_ID FROM "
                           "CITY_TABLE)"));
