@@ -52,11 +52,13 @@ void WidgetAccessible::Set(Evas_Object* object, Role role, const std::string& na
     WIDGET_RET_IF(!IsAccessible(object));
     efl_access_object_role_set(object, GetEflRole(role));
     efl_access_object_description_set(object, OrNull(description));
-    efl_access_object_access_type_set(object, name.empty() ? EFL_ACCESS_TYPE_SKIPPED : EFL_ACCESS_TYPE_REGULAR);
+    efl_access_object_access_type_set(object,
+                                      name.empty() ? EFL_ACCESS_TYPE_SKIPPED : EFL_ACCESS_TYPE_REGULAR);
     if (GetName(object) == name)
         return;
     efl_access_object_i18n_name_set(object, OrNull(name));
-    efl_access_object_event_emit(object, EFL_ACCESS_OBJECT_EVENT_PROPERTY_CHANGED, const_cast<char*>("i18n_name"));
+    efl_access_object_event_emit(object, EFL_ACCESS_OBJECT_EVENT_PROPERTY_CHANGED,
+                                 const_cast<char*>("i18n_name"));
 }
 
 std::string WidgetAccessible::GetName(const Evas_Object* object)

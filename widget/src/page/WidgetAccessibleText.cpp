@@ -17,28 +17,17 @@ const char* const kSentenceSeparator = ". ";
 // One text per condition code, saying what its image shows; unknown codes
 // show the first image.
 const char* const kConditionNames[] = {
-    "IDS_WEATHER_ACCS_SUNNY",
-    "IDS_WEATHER_ACCS_SUNNY",
-    "IDS_WEATHER_ACCS_PARTLY_SUNNY",
-    "IDS_WEATHER_ACCS_CLOUDY",
-    "IDS_WEATHER_ACCS_RAIN",
-    "IDS_WEATHER_ACCS_FOG",
-    "IDS_WEATHER_ACCS_SHOWERS",
-    "IDS_WEATHER_ACCS_PARTLY_SUNNY_WITH_SHOWERS",
-    "IDS_WEATHER_ACCS_THUNDERSTORMS",
-    "IDS_WEATHER_ACCS_PARTLY_SUNNY_WITH_THUNDER_SHOWERS",
-    "IDS_WEATHER_ACCS_FLURRIES",
-    "IDS_WEATHER_ACCS_PARTLY_SUNNY_WITH_FLURRIES",
-    "IDS_WEATHER_ACCS_SNOW",
-    "IDS_WEATHER_ACCS_RAIN_AND_SNOW",
-    "IDS_WEATHER_ACCS_ICE",
-    "IDS_WEATHER_ACCS_HOT",
-    "IDS_WEATHER_ACCS_COLD",
-    "IDS_WEATHER_ACCS_WINDY",
-    "IDS_WEATHER_ACCS_CLEAR",
-    "IDS_WEATHER_ACCS_MOSTLY_CLEAR",
-    "IDS_WEATHER_ACCS_SUNNY",
-    "IDS_WEATHER_ACCS_SUNNY",
+    "IDS_WEATHER_ACCS_SUNNY",         "IDS_WEATHER_ACCS_SUNNY",
+    "IDS_WEATHER_ACCS_PARTLY_SUNNY",  "IDS_WEATHER_ACCS_CLOUDY",
+    "IDS_WEATHER_ACCS_RAIN",          "IDS_WEATHER_ACCS_FOG",
+    "IDS_WEATHER_ACCS_SHOWERS",       "IDS_WEATHER_ACCS_PARTLY_SUNNY_WITH_SHOWERS",
+    "IDS_WEATHER_ACCS_THUNDERSTORMS", "IDS_WEATHER_ACCS_PARTLY_SUNNY_WITH_THUNDER_SHOWERS",
+    "IDS_WEATHER_ACCS_FLURRIES",      "IDS_WEATHER_ACCS_PARTLY_SUNNY_WITH_FLURRIES",
+    "IDS_WEATHER_ACCS_SNOW",          "IDS_WEATHER_ACCS_RAIN_AND_SNOW",
+    "IDS_WEATHER_ACCS_ICE",           "IDS_WEATHER_ACCS_HOT",
+    "IDS_WEATHER_ACCS_COLD",          "IDS_WEATHER_ACCS_WINDY",
+    "IDS_WEATHER_ACCS_CLEAR",         "IDS_WEATHER_ACCS_MOSTLY_CLEAR",
+    "IDS_WEATHER_ACCS_SUNNY",         "IDS_WEATHER_ACCS_SUNNY",
 };
 const int kConditionCount = sizeof(kConditionNames) / sizeof(kConditionNames[0]);
 
@@ -145,8 +134,8 @@ std::string WidgetAccessibleText::GetUpdatedPhrase() const
     std::string time = mWidgetPageData.GetUpdatedTime();
     if (date.empty() || time.empty())
         return std::string();
-    std::string today =
-        NSWeather::ICUUtil::GetDateTimeString(NSWeather::TimeUtil::GetCurrentTime(), NSWeather::ICUUtil::SKELETON_MMdd);
+    std::string today = NSWeather::ICUUtil::GetDateTimeString(NSWeather::TimeUtil::GetCurrentTime(),
+                                                              NSWeather::ICUUtil::SKELETON_MMdd);
     return Fill(Tr("IDS_WEATHER_ACCS_UPDATED"), {date == today ? time : date + " " + time});
 }
 
@@ -158,11 +147,11 @@ std::string WidgetAccessibleText::GetForecastName(int days) const
     for (int day = 0; day < days; ++day)
     {
         int code = data.GetWeeklyConditionCode(cityPtr, day);
-        sentences.push_back(Fill(Tr("IDS_WEATHER_ACCS_FORECAST_DAY"),
-                                 {data.GetWeeklyWeekdayString(cityPtr, day),
-                                  code >= 0 ? GetConditionName(code) : std::string(),
-                                  data.GetWeeklyHighTemperatureString(cityPtr, day),
-                                  data.GetWeeklyLowTemperatureString(cityPtr, day)}));
+        sentences.push_back(Fill(
+            Tr("IDS_WEATHER_ACCS_FORECAST_DAY"),
+            {data.GetWeeklyWeekdayString(cityPtr, day), code >= 0 ? GetConditionName(code) : std::string(),
+             data.GetWeeklyHighTemperatureString(cityPtr, day),
+             data.GetWeeklyLowTemperatureString(cityPtr, day)}));
     }
     return Join(sentences, kSentenceSeparator);
 }

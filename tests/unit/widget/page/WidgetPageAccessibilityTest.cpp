@@ -195,7 +195,8 @@ TEST_P(PageNameTest, SaysWhatThePageShows)
     else
     {
         // The city's clock runs on; only its label is fixed.
-        EXPECT_THAT(name, StartsWith(c.page + ", " + (c.language == std::string("ko") ? "현지 시각 " : "local time ")));
+        EXPECT_THAT(name, StartsWith(c.page + ", " +
+                                     (c.language == std::string("ko") ? "현지 시각 " : "local time ")));
         EXPECT_GT(name.size(), c.page.size() + 16) << name;
     }
     if (!mCity)
@@ -227,10 +228,12 @@ const PageCase kPageCases[] = {
          t.ChangeSetting([](const SettingPtr& s) { s->SetTemperatureUnit(0); });
      },
      "San Francisco, 화씨 56도, 흐림, 21:40 업데이트됨", true, "새로고침", "AccuWeather"},
-    {"CurrentLocationKorean", "4x2", "ko", [](WidgetPageAccessibilityTest& t) { t.UseCity(TodayAt2140(), true); },
+    {"CurrentLocationKorean", "4x2", "ko",
+     [](WidgetPageAccessibilityTest& t) { t.UseCity(TodayAt2140(), true); },
      "San Francisco, 현재 위치, 섭씨 13도, 흐림, 21:40 업데이트됨", false, "새로고침", "AccuWeather"},
     {"UpdatedYesterday", "4x2", "en", [](WidgetPageAccessibilityTest& t) { t.UseCity(TodayAt2140() - kDay); },
-     "San Francisco, 13 degrees Celsius, cloudy, updated " + Strftime("%m/%d", TodayAt2140() - kDay) + " 21:40",
+     "San Francisco, 13 degrees Celsius, cloudy, updated " + Strftime("%m/%d", TodayAt2140() - kDay) +
+         " 21:40",
      true, "Refresh", "AccuWeather"},
     {"NoNetwork", "4x2", "en",
      [](WidgetPageAccessibilityTest& t)
@@ -378,10 +381,11 @@ TEST_F(WidgetPageAccessibilityTest, ForecastReadsTheDaysShown)
     };
     const Case cases[] = {
         {"en", 7,
-         weekday(0, false) + ", sunny, high 16°, low 8°. " + weekday(1, false) + ", sunny, high 15°, low 9°. " +
-             weekday(2, false) + ", cloudy, high 14°, low 10°. " + weekday(3, false) +
-             ", cloudy, high 13°, low 11°"},
-        {"ko", 2, weekday(0, true) + ", 맑음, 최고 16°, 최저 8°. " + weekday(1, true) + ", 맑음, 최고 15°, 최저 9°"},
+         weekday(0, false) + ", sunny, high 16°, low 8°. " + weekday(1, false) +
+             ", sunny, high 15°, low 9°. " + weekday(2, false) + ", cloudy, high 14°, low 10°. " +
+             weekday(3, false) + ", cloudy, high 13°, low 11°"},
+        {"ko", 2,
+         weekday(0, true) + ", 맑음, 최고 16°, 최저 8°. " + weekday(1, true) + ", 맑음, 최고 15°, 최저 9°"},
         {"en", 0, ""},
     };
     for (const Case& c : cases)
@@ -398,8 +402,8 @@ TEST_F(WidgetPageAccessibilityTest, NamedObjectsDieWithThePage)
 {
     UseCity();
     MakePage("4x4");
-    std::vector<Evas_Object*> named = {State(), CityPart("weatherForecastSwallow"), Button("refreshButtonEffect"),
-                                       Button("cpLogoEffect")};
+    std::vector<Evas_Object*> named = {State(), CityPart("weatherForecastSwallow"),
+                                       Button("refreshButtonEffect"), Button("cpLogoEffect")};
     int deleted = 0;
     auto countCb = [](void* data, Evas*, Evas_Object*, void*) { ++*static_cast<int*>(data); };
     for (Evas_Object* object : named)
@@ -417,7 +421,8 @@ TEST(WidgetAccessibleTextTest, ConditionsAreReadAsTheirImagesShowThem)
     setlocale(LC_ALL, "C.UTF-8");
     bindtextdomain("weather-m", (WeatherTest::BuildDir() + "/res/" + kWidgetId + "/res/locale").c_str());
     bind_textdomain_codeset("weather-m", "UTF-8");
-    for (int code : {-1, 0, 1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12, 13, 14, 15, 16, 17, 18, 19, 20, 21, 22, 99})
+    for (int code :
+         {-1, 0, 1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12, 13, 14, 15, 16, 17, 18, 19, 20, 21, 22, 99})
     {
         // "07.weather_view_partly_sunny_with_shower_96x96.png" shows "partly sunny with shower";
         // either may say a little more ("showers").
@@ -449,7 +454,8 @@ TEST(WidgetAccessibleTextTest, FillPutsValuesOnlyWhereAPatternAsks)
         {"%1$", {"a"}, "%1$"},
         {"", {"a"}, ""},
     };
-    for (const Case& c : cases) EXPECT_EQ(WidgetAccessibleText::Fill(c.pattern, c.values), c.expected) << c.pattern;
+    for (const Case& c : cases)
+        EXPECT_EQ(WidgetAccessibleText::Fill(c.pattern, c.values), c.expected) << c.pattern;
 }
 
 }  // namespace
