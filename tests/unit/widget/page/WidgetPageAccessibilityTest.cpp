@@ -153,12 +153,37 @@ public:
     Evas_Object* mWin = nullptr;
 };
 
+void Refreshing(const SettingPtr& s)
+{
+    s->SetUseCurrentLocationOn(true);
+    s->SetShowCurrentCityAgreement(true);
+    s->SetIsNowRefreshing(true);
+    s->SetRefreshingStartTime(time(nullptr));
+}
+
+// A page state: the city (none, one, or the current-location one) and
+// what the settings and system keys say.
 struct PageCase
 {
     const char* name;
     const char* size;
     const char* language;
-    std::function<void(WidgetPageAccessibilityTest&)> prepare;
+    enum
+    {
+        NO_CITY,
+        CITY,
+        CURRENT_LOCATION_CITY
+    } city;
+    enum
+    {
+        UPDATED_TODAY,
+        UPDATED_YESTERDAY,
+        REFRESHING,
+        FAHRENHEIT,
+        OFFLINE,
+        LOCATION_OFF,
+        PROVIDER_WITHOUT_LOGO
+    } state;
     std::string page;  // the whole name, or its start before the local time
     bool hasLocalTime;
     std::string refresh;  // city pages: the two buttons
@@ -170,100 +195,74 @@ void PrintTo(const PageCase& c, std::ostream* out)
     *out << c.name;
 }
 
-void Refreshing(const SettingPtr& s)
-{
-    s->SetUseCurrentLocationOn(true);
-    s->SetShowCurrentCityAgreement(true);
-    s->SetIsNowRefreshing(true);
-    s->SetRefreshingStartTime(time(nullptr));
-}
-
 class PageNameTest : public WidgetPageAccessibilityTest, public ::testing::WithParamInterface<PageCase>
 {
+public:
+    void Prepare(const PageCase& c)
+    {
+        UseLanguage(c.language);
+        if (c.city != PageCase::NO_CITY)
+            UseCity(TodayAt2140() - (c.state == PageCase::UPDATED_YESTERDAY ? kDay : 0),
+                    c.city == PageCase::CURRENT_LOCATION_CITY);
+        ChangeSetting(
+            [&c](const SettingPtr& s)
+            {
+                if (c.state == PageCase::REFRESHING)
+                    Refreshing(s);
+                s->SetTemperatureUnit(c.state == PageCase::FAHRENHEIT ? 0 : 1);
+                s->SetCpType(c.state == PageCase::PROVIDER_WITHOUT_LOGO ? "WeatherNews" : "AccuWeather");
+            });
+        SetKey("memory/dnet/status", c.state == PageCase::OFFLINE ? 0 : 2);
+        for (const char* key : {"db/location/setting/Usemylocation", "db/location/setting/GpsEnabled"})
+            SetKey(key, c.state == PageCase::LOCATION_OFF ? 0 : 1);
+    }
 };
 
 TEST_P(PageNameTest, SaysWhatThePageShows)
 {
     const PageCase& c = GetParam();
-    UseLanguage(c.language);
-    if (c.prepare)
-        c.prepare(*this);
+    Prepare(c);
     MakePage(c.size);
     const std::string name = Name(State());
-    if (!c.hasLocalTime)
-        EXPECT_EQ(name, c.page);
+    if (c.hasLocalTime)  // the city's clock runs on; only its label is fixed
+        EXPECT_THAT(
+            name, StartsWith(c.page + (c.language == std::string("ko") ? ", 현지 시각 " : ", local time ")));
     else
-    {
-        // The city's clock runs on; only its label is fixed.
-        EXPECT_THAT(name, StartsWith(c.page + ", " +
-                                     (c.language == std::string("ko") ? "현지 시각 " : "local time ")));
-        EXPECT_GT(name.size(), c.page.size() + 16) << name;
-    }
-    if (!mCity)
-    {
-        EXPECT_EQ(efl_access_object_role_get(State()), EFL_ACCESS_ROLE_PUSH_BUTTON);
-        return;
-    }
-    EXPECT_EQ(efl_access_object_role_get(State()), EFL_ACCESS_ROLE_PANEL);
+        EXPECT_EQ(name, c.page);
+    EXPECT_EQ(efl_access_object_role_get(State()),
+              mCity ? EFL_ACCESS_ROLE_PANEL : EFL_ACCESS_ROLE_PUSH_BUTTON);
     EXPECT_EQ(Name(Button("refreshButtonEffect")), c.refresh);
-    EXPECT_EQ(efl_access_object_role_get(Button("refreshButtonEffect")), EFL_ACCESS_ROLE_PUSH_BUTTON);
     EXPECT_EQ(Name(Button("cpLogoEffect")), c.logo);
-    EXPECT_EQ(efl_access_object_access_type_get(Button("cpLogoEffect")),
-              c.logo.empty() ? EFL_ACCESS_TYPE_SKIPPED : EFL_ACCESS_TYPE_REGULAR);
+    if (mCity)
+        EXPECT_EQ(efl_access_object_access_type_get(Button("cpLogoEffect")),
+                  c.logo.empty() ? EFL_ACCESS_TYPE_SKIPPED : EFL_ACCESS_TYPE_REGULAR);
 }
 
 const PageCase kPageCases[] = {
-    {"NoCity", "4x2", "en", nullptr, "Weather. Tap here to add a city.", false, "", ""},
-    {"NoCityKorean", "4x4", "ko", nullptr, "날씨. 도시를 추가하려면 여기를 누르세요.", false, "", ""},
-    {"Loading", "4x4", "en", [](WidgetPageAccessibilityTest& t) { t.ChangeSetting(Refreshing); }, "Loading…",
-     false, "", ""},
-    {"LoadingKorean", "4x2", "ko", [](WidgetPageAccessibilityTest& t) { t.ChangeSetting(Refreshing); },
-     "불러오는 중…", false, "", ""},
-    {"City", "4x2", "en", [](WidgetPageAccessibilityTest& t) { t.UseCity(); },
+    {"NoCity", "4x2", "en", PageCase::NO_CITY, PageCase::UPDATED_TODAY, "Weather. Tap here to add a city.",
+     false},
+    {"NoCityKorean", "4x4", "ko", PageCase::NO_CITY, PageCase::UPDATED_TODAY,
+     "날씨. 도시를 추가하려면 여기를 누르세요.", false},
+    {"Loading", "4x4", "en", PageCase::NO_CITY, PageCase::REFRESHING, "Loading…", false},
+    {"LoadingKorean", "4x2", "ko", PageCase::NO_CITY, PageCase::REFRESHING, "불러오는 중…", false},
+    {"City", "4x2", "en", PageCase::CITY, PageCase::UPDATED_TODAY,
      "San Francisco, 13 degrees Celsius, cloudy, updated 21:40", true, "Refresh", "AccuWeather"},
-    {"CityKoreanFahrenheit", "4x4", "ko",
-     [](WidgetPageAccessibilityTest& t)
-     {
-         t.UseCity();
-         t.ChangeSetting([](const SettingPtr& s) { s->SetTemperatureUnit(0); });
-     },
+    {"CityKoreanFahrenheit", "4x4", "ko", PageCase::CITY, PageCase::FAHRENHEIT,
      "San Francisco, 화씨 56도, 흐림, 21:40 업데이트됨", true, "새로고침", "AccuWeather"},
-    {"CurrentLocationKorean", "4x2", "ko",
-     [](WidgetPageAccessibilityTest& t) { t.UseCity(TodayAt2140(), true); },
+    {"CurrentLocationKorean", "4x2", "ko", PageCase::CURRENT_LOCATION_CITY, PageCase::UPDATED_TODAY,
      "San Francisco, 현재 위치, 섭씨 13도, 흐림, 21:40 업데이트됨", false, "새로고침", "AccuWeather"},
-    {"UpdatedYesterday", "4x2", "en", [](WidgetPageAccessibilityTest& t) { t.UseCity(TodayAt2140() - kDay); },
+    {"UpdatedYesterday", "4x2", "en", PageCase::CITY, PageCase::UPDATED_YESTERDAY,
      "San Francisco, 13 degrees Celsius, cloudy, updated " + Strftime("%m/%d", TodayAt2140() - kDay) +
          " 21:40",
      true, "Refresh", "AccuWeather"},
-    {"NoNetwork", "4x2", "en",
-     [](WidgetPageAccessibilityTest& t)
-     {
-         t.UseCity();
-         t.SetKey("memory/dnet/status", 0);
-     },
+    {"Offline", "4x2", "en", PageCase::CITY, PageCase::OFFLINE,
      "San Francisco, 13 degrees Celsius, cloudy, No network connection", true, "Refresh", "AccuWeather"},
-    {"LocationOffOnCurrentLocationCity", "4x2", "en",
-     [](WidgetPageAccessibilityTest& t)
-     {
-         t.UseCity(TodayAt2140(), true);
-         t.SetKey("db/location/setting/Usemylocation", 0);
-         t.SetKey("db/location/setting/GpsEnabled", 0);
-     },
+    {"LocationOffOnCurrentLocationCity", "4x2", "en", PageCase::CURRENT_LOCATION_CITY, PageCase::LOCATION_OFF,
      "San Francisco, current location, 13 degrees Celsius, cloudy, Couldn't find location", false, "Refresh",
      "AccuWeather"},
-    {"RefreshingKorean", "4x2", "ko",
-     [](WidgetPageAccessibilityTest& t)
-     {
-         t.UseCity();
-         t.ChangeSetting(Refreshing);
-     },
+    {"RefreshingKorean", "4x2", "ko", PageCase::CITY, PageCase::REFRESHING,
      "San Francisco, 섭씨 13도, 흐림, 21:40 업데이트됨", true, "새로고침 중", "AccuWeather"},
-    {"ProviderWithoutLogo", "4x2", "en",
-     [](WidgetPageAccessibilityTest& t)
-     {
-         t.UseCity();
-         t.ChangeSetting([](const SettingPtr& s) { s->SetCpType("WeatherNews"); });
-     },
+    {"ProviderWithoutLogo", "4x2", "en", PageCase::CITY, PageCase::PROVIDER_WITHOUT_LOGO,
      "San Francisco, 13 degrees Celsius, sunny, updated 21:40", true, "Refresh", ""},
 };
 
@@ -321,15 +320,6 @@ TEST_F(WidgetPageAccessibilityTest, NamesFollowTheChangesOfThePage)
     }
 }
 
-TEST_F(WidgetPageAccessibilityTest, ButtonsAndThePageSayWhatATapDoes)
-{
-    UseCity();
-    MakePage("4x2");
-    EXPECT_EQ(Description(State()), "Opens the weather app.");
-    EXPECT_EQ(Description(Button("refreshButtonEffect")), "Gets the latest weather.");
-    EXPECT_EQ(Description(Button("cpLogoEffect")), "Opens the weather provider's website.");
-}
-
 // Pressing a button through the accessibility interface does what a tap
 // on it does.
 TEST_F(WidgetPageAccessibilityTest, ButtonsDoWhatATapDoes)
@@ -337,18 +327,21 @@ TEST_F(WidgetPageAccessibilityTest, ButtonsDoWhatATapDoes)
     struct Case
     {
         const char* effectPart;
+        const char* description;
         const char* launched;
     };
     const Case cases[] = {
-        {"refreshButtonEffect", "REQUEST_ALL_WEATHER_INFO"},
-        {"cpLogoEffect", "https://www.accuweather.com/?partner="},
+        {"refreshButtonEffect", "Gets the latest weather.", "REQUEST_ALL_WEATHER_INFO"},
+        {"cpLogoEffect", "Opens the weather provider's website.", "https://www.accuweather.com/?partner="},
     };
     UseCity();
     MakePage("4x2");
+    EXPECT_EQ(Description(State()), "Opens the weather app.");
     for (const Case& c : cases)
     {
         Evas_Object* button = Button(c.effectPart);
         ASSERT_NE(button, nullptr) << c.effectPart;
+        EXPECT_EQ(Description(button), c.description);
         int activate = -1;
         for (int i = 0; const char* action = efl_access_action_name_get(button, i); ++i)
             activate = std::string(action) == "activate" ? i : activate;
@@ -365,35 +358,13 @@ TEST_F(WidgetPageAccessibilityTest, ButtonsDoWhatATapDoes)
 TEST_F(WidgetPageAccessibilityTest, ForecastReadsTheDaysShown)
 {
     const time_t refreshed = TodayAt2140();
-    auto weekday = [refreshed](int day, bool korean)
+    const std::string twoDays = Strftime("%a", refreshed) + ", sunny, high 16°, low 8°. " +
+                                Strftime("%a", refreshed + kDay) + ", sunny, high 15°, low 9°";
+    for (int days : {2, 0})
     {
-        static const char* const kKorean[] = {"일", "월", "화", "수", "목", "금", "토"};
-        struct tm tm = {};
-        time_t t = refreshed + day * kDay;
-        gmtime_r(&t, &tm);
-        return korean ? std::string(kKorean[tm.tm_wday]) : Strftime("%a", t);
-    };
-    struct Case
-    {
-        const char* language;
-        int days;
-        std::string expected;
-    };
-    const Case cases[] = {
-        {"en", 7,
-         weekday(0, false) + ", sunny, high 16°, low 8°. " + weekday(1, false) +
-             ", sunny, high 15°, low 9°. " + weekday(2, false) + ", cloudy, high 14°, low 10°. " +
-             weekday(3, false) + ", cloudy, high 13°, low 11°"},
-        {"ko", 2,
-         weekday(0, true) + ", 맑음, 최고 16°, 최저 8°. " + weekday(1, true) + ", 맑음, 최고 15°, 최저 9°"},
-        {"en", 0, ""},
-    };
-    for (const Case& c : cases)
-    {
-        UseLanguage(c.language);
-        mCity = SampleCities::MakeCity(kSanFrancisco, refreshed, c.days);
+        mCity = SampleCities::MakeCity(kSanFrancisco, refreshed, days);
         MakePage("4x4");
-        EXPECT_EQ(Name(CityPart("weatherForecastSwallow")), c.expected) << c.language << " " << c.days;
+        EXPECT_EQ(Name(CityPart("weatherForecastSwallow")), days ? twoDays : "") << days;
     }
 }
 
@@ -436,26 +407,6 @@ TEST(WidgetAccessibleTextTest, ConditionsAreReadAsTheirImagesShowThem)
         EXPECT_TRUE(name.rfind(words, 0) == 0 || words.rfind(name, 0) == 0) << code << ": " << name;
     }
     unsetenv("LANGUAGE");
-}
-
-TEST(WidgetAccessibleTextTest, FillPutsValuesOnlyWhereAPatternAsks)
-{
-    struct Case
-    {
-        const char* pattern;
-        std::vector<std::string> values;
-        const char* expected;
-    };
-    const Case cases[] = {
-        {"%s degrees", {"5"}, "5 degrees"},
-        {"%2$s, %1$s", {"a", "b"}, "b, a"},
-        {"%s %s %s", {"a"}, "a  "},
-        {"%9$s|%d|100%", {"a"}, "|%d|100%"},
-        {"%1$", {"a"}, "%1$"},
-        {"", {"a"}, ""},
-    };
-    for (const Case& c : cases)
-        EXPECT_EQ(WidgetAccessibleText::Fill(c.pattern, c.values), c.expected) << c.pattern;
 }
 
 }  // namespace
