@@ -425,6 +425,10 @@ void Widget4x2Page::UpdateLogo(Evas_Object* bottomLine)
 {
     std::string logo = mWidgetPageDataPtr->GetCPLogoIconPath();
     bool isShown = !logo.empty() && SetPartImage(bottomLine, "cpLogo", logo);
+    // Where no logo is drawn, a tap must not open the provider's site.
+    Evas_Object* effect = elm_object_part_content_get(bottomLine, "cpLogoEffect");
+    if (effect)
+        evas_object_pass_events_set(effect, !isShown);
     SetButtonAccessibleName(bottomLine, "cpLogoEffect",
                             WidgetAccessibleText::GetLogoName(isShown ? logo : ""),
                             isShown ? WidgetAccessibleText::GetLogoDescription() : std::string());
