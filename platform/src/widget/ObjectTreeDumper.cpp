@@ -11,6 +11,8 @@
 // Stable class getters of Evas and Edje whose headers sit behind the beta switch.
 extern "C" const Efl_Class* efl_canvas_layout_class_get(void);
 extern "C" const Efl_Class* efl_canvas_group_class_get(void);
+extern "C" const Efl_Class* efl_access_object_mixin_get(void);
+extern "C" const char* efl_access_object_i18n_name_get(const Eo* obj);
 
 namespace platform
 {
@@ -35,6 +37,14 @@ bool IsElmImage(Evas_Object* object)
 std::string Field(const std::string& name, const std::string& jsonValue)
 {
     return ObjectTreeDumper::Quote(name) + ":" + jsonValue;
+}
+
+// What a screen reader reads for the object, if anything.
+std::string GetAccessibleName(Evas_Object* object)
+{
+    const char* name =
+        efl_isa(object, efl_access_object_mixin_get()) ? efl_access_object_i18n_name_get(object) : nullptr;
+    return name ? name : std::string();
 }
 
 std::string Join(const std::vector<std::string>& items)
@@ -142,6 +152,9 @@ std::string ObjectTreeDumper::DumpObject(Evas_Object* object, int depth)
     fields.push_back(Field("visible", evas_object_visible_get(object) ? "true" : "false"));
     fields.push_back(Field("geometry", "[" + std::to_string(x) + "," + std::to_string(y) + "," +
                                            std::to_string(w) + "," + std::to_string(h) + "]"));
+    std::string accessibleName = GetAccessibleName(object);
+    if (!accessibleName.empty())
+        fields.push_back(Field("accessibleName", Quote(accessibleName)));
     if (efl_isa(object, efl_canvas_layout_class_get()))
     {
         fields.push_back(DescribeLayout(object, swallowed, depth));

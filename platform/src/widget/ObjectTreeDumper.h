@@ -16,7 +16,8 @@ namespace platform
 // with its top-level objects bottom to top: for each
 // layout object its file, group, the texts of its text parts and what each
 // swallow part holds; for each image its file and group (or key); texts of
-// text objects. Objects that hold none of these (rectangles, clippers) are
+// text objects; the name a screen reader reads, for objects that have
+// one. Objects that hold none of these (rectangles, clippers) are
 // left out unless something below them counts.
 class ObjectTreeDumper
 {

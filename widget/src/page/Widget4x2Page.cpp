@@ -12,6 +12,8 @@
 #include "NetworkConnection.h"
 #include "WeatherDefine.h"
 #include "Widget4x2PageData.h"
+#include "WidgetAccessible.h"
+#include "WidgetAccessibleText.h"
 #include "CallbackTrampoline.h"
 #include "WidgetLog.h"
 
@@ -22,6 +24,9 @@ namespace
 {
 const char* const kTextDomain = "weather-m";
 const char* const kRefreshImage = "weather_box_ic_refresh.png";
+// What the bottom line emits for a tap on the logo or the refresh button.
+const WidgetAccessible::TapSignal kLogoTap = {"cpLogoClicked", "cpLogoEffect"};
+const WidgetAccessible::TapSignal kRefreshTap = {"refreshIconClicked", "refreshButtonEffect"};
 // The providers' home pages, with our partner code.
 const char* const kProviderUrls[] = {"https://www.accuweather.com/?partner=quorvexweather",
                                      "https://www.weather.com.cn/?partner=quorvexweather",
@@ -245,6 +250,8 @@ Evas_Object* Widget4x2Page::CreateCityLayout()
         elm_object_part_content_set(cityLayout, "bottomLineSwallow", bottomLineLayout);
         elm_object_part_content_set(bottomLineLayout, "cpLogoEffect", cpLogoLayout);
         elm_object_part_content_set(bottomLineLayout, "refreshButtonEffect", refreshButtonEffect);
+        WidgetAccessible::AddButton(cpLogoLayout, kLogoTap);
+        WidgetAccessible::AddButton(refreshButtonEffect, kRefreshTap);
         if (isCurrent)
             elm_object_signal_emit(cityLayout, "receiver,invisible,localtime", "localTime");
         isComplete = AddCityExtras(cityLayout);
@@ -310,12 +317,16 @@ int Widget4x2Page::UpdateNoCityPage()
     if (isLoading)
     {
         elm_object_part_text_set(mNoCityLayout, "message", Tr("IDS_DB_POP_LOADING_ING"));
+        WidgetAccessible::Set(mNoCityLayout, WidgetAccessible::ROLE_BUTTON,
+                              WidgetAccessibleText::GetLoadingName());
         return NSWeather::ERR_OK;
     }
     Evas_Object* content = elm_object_part_content_get(mNoCityLayout, "content");
     WIDGET_RETV_IF(content == NULL, -1);
     elm_object_part_text_set(content, "title", Tr("IDS_DB_TAB_WEATHER"));
     elm_object_part_text_set(content, "message", Tr("IDS_DB_NPBODY_TAP_HERE_TO_ADD_A_CITY"));
+    WidgetAccessible::Set(mNoCityLayout, WidgetAccessible::ROLE_BUTTON,
+                          WidgetAccessibleText::GetNoCityName());
     return NSWeather::ERR_OK;
 }
 
@@ -349,7 +360,28 @@ int Widget4x2Page::UpdateCityPage()
     WIDGET_RETV_IF(!UpdateBottomLine(bottomLine), -1);
     UpdateLogo(bottomLine);
     UpdateRefreshButton(false);
+    UpdateCityAccessibleName();
     return NSWeather::ERR_OK;
+}
+
+// Read as drawn: the bottom line's reason instead of the update time when
+// it shows one.
+void Widget4x2Page::UpdateCityAccessibleName()
+{
+    Evas_Object* bottomLine = GetCityPart("bottomLineSwallow");
+    WIDGET_RET_IF(bottomLine == NULL || !mWidgetPageDataPtr);
+    const char* message = elm_object_part_text_get(bottomLine, "msg");
+    WidgetAccessibleText text(*mWidgetPageDataPtr);
+    WidgetAccessible::Set(mCityLayout, WidgetAccessible::ROLE_PANEL, text.GetCityName(message ? message : ""),
+                          WidgetAccessibleText::GetCityDescription());
+}
+
+void Widget4x2Page::SetButtonAccessibleName(Evas_Object* bottomLine, const char* effectPart,
+                                            const std::string& name, const std::string& description)
+{
+    Evas_Object* effect = elm_object_part_content_get(bottomLine, effectPart);
+    WidgetAccessible::Set(WidgetAccessible::GetButton(effect), WidgetAccessible::ROLE_BUTTON, name,
+                          description);
 }
 
 bool Widget4x2Page::UpdateBottomLine(Evas_Object* bottomLine)
@@ -384,6 +416,7 @@ void Widget4x2Page::ShowBottomLineMessage(const char* message)
     elm_object_part_text_set(bottomLine, "date", "");
     elm_object_part_text_set(bottomLine, "time", "");
     elm_object_part_text_set(bottomLine, "msg", Tr(message));
+    UpdateCityAccessibleName();
 }
 
 // A provider without a widget logo gets a page without one, not a
@@ -391,7 +424,15 @@ void Widget4x2Page::ShowBottomLineMessage(const char* message)
 void Widget4x2Page::UpdateLogo(Evas_Object* bottomLine)
 {
     std::string logo = mWidgetPageDataPtr->GetCPLogoIconPath();
-    if (!logo.empty() && SetPartImage(bottomLine, "cpLogo", logo))
+    bool isShown = !logo.empty() && SetPartImage(bottomLine, "cpLogo", logo);
+    // Where no logo is drawn, a tap must not open the provider's site.
+    Evas_Object* effect = elm_object_part_content_get(bottomLine, "cpLogoEffect");
+    if (effect)
+        evas_object_pass_events_set(effect, !isShown);
+    SetButtonAccessibleName(bottomLine, "cpLogoEffect",
+                            WidgetAccessibleText::GetLogoName(isShown ? logo : ""),
+                            isShown ? WidgetAccessibleText::GetLogoDescription() : std::string());
+    if (isShown)
         return;
     WIDGET_LOG("no provider logo: %s", logo.c_str());
     Evas_Object* old = elm_object_part_content_unset(bottomLine, "cpLogo");
@@ -425,7 +466,11 @@ void Widget4x2Page::UpdateRefreshButton(bool stop)
     Evas_Object* bottomLine = GetCityPart("bottomLineSwallow");
     if (!bottomLine)
         return;
-    if (!stop && mWidgetPageDataPtr->GetIsNowRefreshing())
+    bool isRefreshing = !stop && mWidgetPageDataPtr->GetIsNowRefreshing();
+    SetButtonAccessibleName(bottomLine, "refreshButtonEffect",
+                            WidgetAccessibleText::GetRefreshName(isRefreshing),
+                            WidgetAccessibleText::GetRefreshDescription());
+    if (isRefreshing)
     {
         if (!mActivityIndicator)
             mActivityIndicator = CreateActivityIndicator(bottomLine);
@@ -469,6 +514,9 @@ int Widget4x2Page::Refresh()
     if (!mWidgetPageDataPtr->SetIsNowRefreshing(true))
         WIDGET_LOG("SetIsNowRefreshing failed");
     mRefreshButtonIcon = nullptr;
+    SetButtonAccessibleName(bottomLine, "refreshButtonEffect", WidgetAccessibleText::GetRefreshName(true),
+                            WidgetAccessibleText::GetRefreshDescription());
+    UpdateCityAccessibleName();
     WIDGET_LOG("refresh button clicked");
     return NSWeather::ERR_OK;
 }

@@ -67,6 +67,9 @@ private:
     int UpdateNoCityPage();
     int UpdateCityPage();
     void ShowBottomLineMessage(const char* message);
+    void UpdateCityAccessibleName();
+    static void SetButtonAccessibleName(Evas_Object* bottomLine, const char* effectPart,
+                                        const std::string& name, const std::string& description);
     bool UpdateBottomLine(Evas_Object* bottomLine);
     void UpdateLogo(Evas_Object* bottomLine);
     Evas_Object* CreateActivityIndicator(Evas_Object* parent);

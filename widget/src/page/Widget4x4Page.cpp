@@ -4,6 +4,8 @@
 #include <Elementary.h>
 
 #include "Widget4x4PageData.h"
+#include "WidgetAccessible.h"
+#include "WidgetAccessibleText.h"
 #include "WidgetLog.h"
 
 namespace NSWeatherWidget
@@ -26,7 +28,11 @@ bool Widget4x4Page::AddCityExtras(Evas_Object* cityLayout)
 
 void Widget4x4Page::UpdateCityExtras(Evas_Object* cityLayout)
 {
-    UpdateWeekly(elm_object_part_content_get(cityLayout, "weatherForecastSwallow"));
+    Evas_Object* forecastLayout = elm_object_part_content_get(cityLayout, "weatherForecastSwallow");
+    int days = UpdateWeekly(forecastLayout);
+    if (forecastLayout && mWidgetPageDataPtr)
+        WidgetAccessible::Set(forecastLayout, WidgetAccessible::ROLE_PANEL,
+                              WidgetAccessibleText(*mWidgetPageDataPtr).GetForecastName(days));
 }
 
 void Widget4x4Page::EmitToday(const char* signal)
@@ -40,20 +46,21 @@ void Widget4x4Page::EmitToday(const char* signal)
 }
 
 // The first missing day ends the rows; it and the later rows stay empty.
-void Widget4x4Page::UpdateWeekly(Evas_Object* weatherForecastLayout)
+int Widget4x4Page::UpdateWeekly(Evas_Object* weatherForecastLayout)
 {
-    WIDGET_RET_IF(weatherForecastLayout == NULL);
-    WIDGET_RET_IF(!mWidgetPageDataPtr);
+    WIDGET_RETV_IF(weatherForecastLayout == NULL, 0);
+    WIDGET_RETV_IF(!mWidgetPageDataPtr, 0);
     std::string widgetResEdjPath = WidgetPageData::GetResourceEdjPath();
-    WIDGET_RET_IF(widgetResEdjPath.length() < 1);
+    WIDGET_RETV_IF(widgetResEdjPath.length() < 1, 0);
     for (int row = 1; row <= kForecastDays; ++row)
     {
         if (!UpdateDay(weatherForecastLayout, row))
         {
             ClearDays(weatherForecastLayout, row);
-            return;
+            return row - 1;
         }
     }
+    return kForecastDays;
 }
 
 // A layout filled again for another city must not keep that city's days.

@@ -16,7 +16,8 @@ public:
     Widget4x4Page() = default;
     ~Widget4x4Page() override = default;
 
-    void UpdateWeekly(Evas_Object* forecastLayout);
+    // The number of rows filled.
+    int UpdateWeekly(Evas_Object* forecastLayout);
 
 protected:
     std::string GetEdjPath() const override;

@@ -3,6 +3,7 @@
 #include <libintl.h>
 #include <vconf.h>
 
+#include <algorithm>
 #include <cmath>
 #include <cstdlib>
 #include <stdexcept>
@@ -193,6 +194,29 @@ std::string WidgetPageData::GetWeeklyIconPath(const CityPtr& cityPtr, int dayInd
     NSWeather::IconMappingTable iconMappingTable;
     int iconNum = iconMappingTable.GetMappingIconNum(weeklyPtr->GetWeatherIcon(), true);
     return ViewBasicElements::MakeWeatherIconName(kViewTypeDay, iconNum, pressed);
+}
+
+// A negative number shows the default image, so it reads as that one.
+int WidgetPageData::GetCurrentConditionCode() const
+{
+    WIDGET_RETV_IF(!mCityPtr, -1);
+    WIDGET_RETV_IF(!mCityPtr->GetCurrentPtr(), -1);
+    bool isDay = true;
+    return std::max(0, GetCurrentIconNum(isDay));
+}
+
+int WidgetPageData::GetWeeklyConditionCode(const CityPtr& cityPtr, int dayIndex) const
+{
+    WeeklyPtr weeklyPtr = GetWeeklyPtr(cityPtr, dayIndex);
+    WIDGET_RETV_IF(!weeklyPtr, -1);
+    WIDGET_RETV_IF(!cityPtr->GetExtraPtr(), -1);
+    NSWeather::IconMappingTable iconMappingTable;
+    return std::max(0, iconMappingTable.GetMappingIconNum(weeklyPtr->GetWeatherIcon(), true));
+}
+
+bool WidgetPageData::GetIsCelsius() const
+{
+    return mSettingPtr && mSettingPtr->GetTemperatureUnit() == kCelsius;
 }
 
 // A refresh whose end never arrived stops counting after 90 seconds.

@@ -49,6 +49,12 @@ public:
     std::string GetWeeklyHighTemperatureString(const NSWeather::CityPtr& cityPtr, int dayIndex) const;
     std::string GetWeeklyLowTemperatureString(const NSWeather::CityPtr& cityPtr, int dayIndex) const;
     std::string GetWeeklyIconPath(const NSWeather::CityPtr& cityPtr, int dayIndex, bool pressed) const;
+    // Condition codes of the images shown (see ViewBasicElements); -1
+    // when there is no image.
+    int GetCurrentConditionCode() const;
+    int GetWeeklyConditionCode(const NSWeather::CityPtr& cityPtr, int dayIndex) const;
+    // The scale temperatures are shown in; false without settings.
+    bool GetIsCelsius() const;
     bool GetIsNowRefreshing() const;
     // Stores the state in the settings row; false when it was not written.
     bool SetIsNowRefreshing(bool isNowRefreshing);

@@ -37,22 +37,37 @@ TEST_F(WidgetTapsTest, TapsOpenTheApplicationTheAddCityFlowOrTheProviderPage)
     {
         const char* name;
         int cities;
+        const char* cpType;
         const char* where;
-        std::vector<std::string> launch;
+        std::vector<std::string> launch;  // empty: nothing is launched
     };
     const Case cases[] = {
-        {"Page", 3, kBody, {"\"app_id\":\"com.quorvex.weather-m\"", "\"LOCATION_ID\":\"190390\""}},
-        {"NoCity", 0, kBody, {"\"app_id\":\"com.quorvex.weather-m\"", "\"MODE\":\"ADD_CITY\""}},
-        {"Logo", 1, kLogo, {"\"app_id\":\"org.tizen.browser\"", "accuweather.com", "partner="}},
+        {"Page",
+         3,
+         "AccuWeather",
+         kBody,
+         {"\"app_id\":\"com.quorvex.weather-m\"", "\"LOCATION_ID\":\"190390\""}},
+        {"NoCity",
+         0,
+         "AccuWeather",
+         kBody,
+         {"\"app_id\":\"com.quorvex.weather-m\"", "\"MODE\":\"ADD_CITY\""}},
+        {"Logo",
+         1,
+         "AccuWeather",
+         kLogo,
+         {"\"app_id\":\"org.tizen.browser\"", "accuweather.com", "partner="}},
+        {"WhereNoLogoIsDrawn", 1, "WeatherNews", kLogo, {}},
     };
     for (const Case& c : cases)
     {
         SCOPED_TRACE(c.name);
+        ChangeSetting([&c](const NSWeather::SettingPtr& s) { s->SetCpType(c.cpType); });
         Start(c.cities);
         Tap(c.where);
         WaitIdle();
         std::vector<std::string> launches = Launches();
-        ASSERT_EQ(launches.size(), 1u);
+        ASSERT_EQ(launches.size(), c.launch.empty() ? 0u : 1u);
         for (const std::string& part : c.launch) EXPECT_THAT(launches[0], HasSubstr(part));
         TearDown();
         mHostPid = -1;

@@ -10,6 +10,7 @@
 #include <cstdlib>
 #include <cstring>
 #include <map>
+#include <set>
 #include <string>
 
 #include "EdjeCanvas.h"
@@ -27,6 +28,38 @@ const char* const kTextIds[] = {
     "IDS_IDLE_HEADER_NO_NETWORK_CONNECTION_ABB3",
     "IDS_AW_BODY_FAILED_TO_FIND_LOCATION_ABB2",
     "IDS_MF_BODY_M_DEGREE",
+    // Read by screen readers.
+    "IDS_WEATHER_ACCS_SUNNY",
+    "IDS_WEATHER_ACCS_PARTLY_SUNNY",
+    "IDS_WEATHER_ACCS_CLOUDY",
+    "IDS_WEATHER_ACCS_RAIN",
+    "IDS_WEATHER_ACCS_FOG",
+    "IDS_WEATHER_ACCS_SHOWERS",
+    "IDS_WEATHER_ACCS_PARTLY_SUNNY_WITH_SHOWERS",
+    "IDS_WEATHER_ACCS_THUNDERSTORMS",
+    "IDS_WEATHER_ACCS_PARTLY_SUNNY_WITH_THUNDER_SHOWERS",
+    "IDS_WEATHER_ACCS_FLURRIES",
+    "IDS_WEATHER_ACCS_PARTLY_SUNNY_WITH_FLURRIES",
+    "IDS_WEATHER_ACCS_SNOW",
+    "IDS_WEATHER_ACCS_RAIN_AND_SNOW",
+    "IDS_WEATHER_ACCS_ICE",
+    "IDS_WEATHER_ACCS_HOT",
+    "IDS_WEATHER_ACCS_COLD",
+    "IDS_WEATHER_ACCS_WINDY",
+    "IDS_WEATHER_ACCS_CLEAR",
+    "IDS_WEATHER_ACCS_MOSTLY_CLEAR",
+    "IDS_WEATHER_ACCS_CURRENT_LOCATION",
+    "IDS_WEATHER_ACCS_DEGREES_CELSIUS",
+    "IDS_WEATHER_ACCS_DEGREES_FAHRENHEIT",
+    "IDS_WEATHER_ACCS_UPDATED",
+    "IDS_WEATHER_ACCS_LOCAL_TIME",
+    "IDS_WEATHER_ACCS_OPEN_APP_DESCRIPTION",
+    "IDS_WEATHER_ACCS_FORECAST_DAY",
+    "IDS_WEATHER_ACCS_REFRESH",
+    "IDS_WEATHER_ACCS_REFRESHING",
+    "IDS_WEATHER_ACCS_REFRESH_DESCRIPTION",
+    "IDS_WEATHER_ACCS_WEATHER_PROVIDER",
+    "IDS_WEATHER_ACCS_PROVIDER_DESCRIPTION",
 };
 
 std::string CataloguePath(const std::string& lang)
@@ -121,6 +154,27 @@ TEST(DegreeSignTest, BothLanguagesAppendADegreeSign)
 {
     for (const char* lang : {"en", "ko"})
         EXPECT_EQ(ReadCatalogue(CataloguePath(lang))["IDS_MF_BODY_M_DEGREE"], "\xC2\xB0") << lang;
+}
+
+// A value whose placeholder a translation lost would not be read aloud.
+TEST(PlaceholderTest, BothLanguagesKeepTheSamePlaceholders)
+{
+    auto placeholders = [](const std::string& text)
+    {
+        std::multiset<std::string> found;
+        for (size_t at = text.find('%'); at != std::string::npos; at = text.find('%', at + 1))
+            found.insert(text.substr(at, text.compare(at + 2, 1, "$") == 0 ? 4 : 2));
+        return found;
+    };
+    const auto english = ReadCatalogue(CataloguePath("en"));
+    const auto korean = ReadCatalogue(CataloguePath("ko"));
+    int withPlaceholders = 0;
+    for (const char* id : kTextIds)
+    {
+        EXPECT_EQ(placeholders(korean.at(id)), placeholders(english.at(id))) << id;
+        withPlaceholders += placeholders(english.at(id)).empty() ? 0 : 1;
+    }
+    EXPECT_GT(withPlaceholders, 0);
 }
 
 TEST(MalformedCatalogueTest, ReaderRejectsFilesThatAreNotCatalogues)

@@ -1,6 +1,8 @@
 // Vertical swipes fed through the host move between cities.
 #include <gtest/gtest.h>
 
+#include <vconf.h>
+
 #include <cstdlib>
 
 #include "FileUtil.h"
@@ -165,6 +167,28 @@ TEST_F(WidgetFlickTest, GapInPageIndexesFollowsListPositions)
     WaitIdle();
     EXPECT_EQ(CentreText(Id(1), "name"), "Berlin");
     EXPECT_EQ(ReadSetting()->GetCurrentCityLocationId(), "178087");
+}
+
+}  // namespace WeatherTest
+
+namespace WeatherTest
+{
+
+// The real widget reads its centre page aloud: the city a flick brought,
+// then in the language chosen afterwards.
+TEST_F(WidgetFlickTest, CentrePageIsReadAloudAfterAFlickAndALanguageChange)
+{
+    auto centreStartsWith = [this](const std::string& start)
+    { return CentreText(Id(1), "accessibleName").rfind(start, 0) == 0; };
+    Start(3, 0);
+    EXPECT_TRUE(centreStartsWith("서울, 22 degrees Celsius, ")) << CentreText(Id(1), "accessibleName");
+    Swipe(1, -150);
+    WaitIdle();
+    EXPECT_TRUE(centreStartsWith("Reykjavík, -3 degrees Celsius, snow, updated "))
+        << CentreText(Id(1), "accessibleName");
+    ASSERT_EQ(vconf_set_str("db/menu_widget/language", "ko_KR.UTF-8"), 0);
+    EXPECT_TRUE(WaitUntil([&] { return centreStartsWith("Reykjavík, 섭씨 -3도, 눈, "); }, 10.0))
+        << CentreText(Id(1), "accessibleName");
 }
 
 }  // namespace WeatherTest
