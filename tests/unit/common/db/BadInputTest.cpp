@@ -1,5 +1,3 @@
-#include <random>
-
 #include "ContentProvider.h"
 #include "DataStoreInitializer.h"
 #include "IconMappingTable.h"
@@ -10,18 +8,11 @@
 #include "WeatherDefine.h"
 
 using namespace NSWeather;
+using WeatherTest::RandomBytes;
 using WeatherTest::RawDB;
 
 namespace
 {
-
-std::string RandomBytes(size_t size, unsigned seed)
-{
-    std::mt19937 generator(seed);
-    std::string bytes(size, '\0');
-    for (char& byte : bytes) byte = static_cast<char>(generator() & 0xff);
-    return bytes;
-}
 
 class BadInputTest : public WeatherTest::StoreTest
 {

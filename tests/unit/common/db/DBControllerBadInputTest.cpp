@@ -5,7 +5,6 @@
 #include <climits>
 #include <fstream>
 #include <functional>
-#include <random>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -105,9 +104,7 @@ protected:
 
 TEST_F(DBControllerBadInputTest, RandomBytesAreNeitherReadNorOverwritten)
 {
-    std::mt19937 random(7);
-    std::string bytes(8192, '\0');
-    for (char& c : bytes) c = static_cast<char>(random());
+    std::string bytes = WeatherTest::RandomBytes(8192, 7);
     ReplaceWeatherDB(bytes);
     ExpectEveryOperationFails();
     EXPECT_EQ(WeatherTest::ReadText(WeatherDBPath()), bytes);

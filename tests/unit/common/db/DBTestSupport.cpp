@@ -1,5 +1,6 @@
 #include "DBTestSupport.h"
 
+#include <random>
 #include <sstream>
 
 #include <poll.h>
@@ -324,6 +325,14 @@ std::string OldWeatherTableSql(const std::string& table, double version)
         kept += (kept.empty() ? "" : ",") + piece;
     }
     return sql.substr(0, open + 1) + kept + ")";
+}
+
+std::string RandomBytes(size_t size, unsigned seed)
+{
+    std::mt19937 generator(seed);
+    std::string bytes(size, '\0');
+    for (char& byte : bytes) byte = static_cast<char>(generator() & 0xff);
+    return bytes;
 }
 
 bool FileExists(const std::string& path)

@@ -24,6 +24,9 @@ extern const std::pair<const char*, const char*> WEATHER_TABLE_FORMATS[6];
 
 bool FileExists(const std::string& path);
 
+// `size` bytes of a fixed pseudo-random sequence, as a damaged file holds.
+std::string RandomBytes(size_t size, unsigned seed);
+
 // A fresh platform root per test, with FileUtil asked again for it.
 class StoreTest : public PlatformTest
 {

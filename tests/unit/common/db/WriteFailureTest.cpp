@@ -100,8 +100,6 @@ protected:
         ASSERT_EQ(ERR_OK, DBController().InsertCityData(CityAt("b", 2, 1)));
     }
 
-    std::string SettingDBPath() const { return DBDir() + "/.setting.db"; }
-
     // Both files byte for byte: a rolled-back cycle leaves no trace.
     std::string Snapshot() const
     {

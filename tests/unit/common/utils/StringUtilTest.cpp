@@ -4,19 +4,12 @@
 
 #include <climits>
 #include <locale>
+#include <string>
+#include <utility>
 
 namespace
 {
 using NSWeather::StringUtil;
-
-TEST(StringUtilTest, PlainDecimalText)
-{
-    EXPECT_EQ(StringUtil::IntToString(0), "0");
-    EXPECT_EQ(StringUtil::IntToString(-3), "-3");
-    EXPECT_EQ(StringUtil::IntToString(999), "999");
-    EXPECT_EQ(StringUtil::IntToString(INT_MIN), "-2147483648");
-    EXPECT_EQ(StringUtil::IntToString(INT_MAX), "2147483647");
-}
 
 struct Grouping : std::numpunct<char>
 {
@@ -24,10 +17,13 @@ struct Grouping : std::numpunct<char>
     char do_thousands_sep() const override { return ','; }
 };
 
-TEST(StringUtilTest, IgnoresGlobalLocale)
+// A program locale with digit grouping must not reach the texts.
+TEST(StringUtilTest, PlainDecimalTextWhateverTheGlobalLocale)
 {
     std::locale old = std::locale::global(std::locale(std::locale::classic(), new Grouping));
-    EXPECT_EQ(StringUtil::IntToString(1830000), "1830000");
+    const std::pair<int, const char*> cases[] = {
+        {0, "0"}, {-3, "-3"}, {1830000, "1830000"}, {INT_MIN, "-2147483648"}, {INT_MAX, "2147483647"}};
+    for (const auto& [value, text] : cases) EXPECT_EQ(StringUtil::IntToString(value), text);
     std::locale::global(old);
 }
 }  // namespace

@@ -22,8 +22,6 @@ TEST_F(ApiGuardTest, CallbackProblemsStayOnThisSideAndAreLogged)
     EXPECT_TRUE(mLog.Contains("exception caught: disk gone", "TEST_TAG")) << mLog.Dump();
     EXPECT_EQ(-1, NSWeather::ForwardCallback<int>(nullptr, fails, PLATFORM_CALLBACK_SITE("TEST_TAG"), -1));
     EXPECT_TRUE(mLog.Contains("callback without its object", "TEST_TAG")) << mLog.Dump();
-    EXPECT_EQ(2, NSWeather::ForwardCallback<int>(
-                     &object, [](int& value) { return value + 1; }, PLATFORM_CALLBACK_SITE("TEST_TAG"), -1));
 }
 
 }  // namespace
