@@ -5,8 +5,9 @@
 #include <Elementary.h>
 
 #include <algorithm>
-#include <cstdio>
 #include <cstring>
+
+#include "core/JsonText.h"
 
 // Stable class getters of Evas and Edje whose headers sit behind the beta switch.
 extern "C" const Efl_Class* efl_canvas_layout_class_get(void);
@@ -63,40 +64,11 @@ ObjectTreeDumper::~ObjectTreeDumper()
         ecore_evas_free(mScratch);
 }
 
+// Canvas texts come from stored files another process wrote: bytes that
+// are not UTF-8 must not break the line's JSON.
 std::string ObjectTreeDumper::Quote(const std::string& text)
 {
-    std::string out = "\"";
-    for (unsigned char c : text)
-    {
-        switch (c)
-        {
-            case '"':
-                out += "\\\"";
-                break;
-            case '\\':
-                out += "\\\\";
-                break;
-            case '\n':
-                out += "\\n";
-                break;
-            case '\t':
-                out += "\\t";
-                break;
-            case '\r':
-                out += "\\r";
-                break;
-            default:
-                if (c < 0x20)
-                {
-                    char escaped[8];
-                    snprintf(escaped, sizeof(escaped), "\\u%04x", c);
-                    out += escaped;
-                }
-                else
-                    out += static_cast<char>(c);
-        }
-    }
-    return out + "\"";
+    return JsonString(text);
 }
 
 std::string ObjectTreeDumper::Dump(Evas* canvas)

@@ -46,11 +46,12 @@ TEST(ControlCommand, CallbackFailuresBecomeErrWithTheirCode)
 
 TEST(ControlCommand, DumpTextsAreValidJsonStrings)
 {
-    EXPECT_EQ(ObjectTreeDumper::Quote("Seoul \"12\"\n\\"), "\"Seoul \\\"12\\\"\\n\\\\\"");
+    EXPECT_EQ(ObjectTreeDumper::Quote("Seoul \"12\"\n\\"), "\"Seoul \\\"12\\\"\\u000a\\\\\"");
     EXPECT_EQ(ObjectTreeDumper::Quote(std::string("a\x01"
                                                   "b")),
               "\"a\\u0001b\"");
     EXPECT_EQ(ObjectTreeDumper::Quote("서울"), "\"서울\"");
+    EXPECT_EQ(ObjectTreeDumper::Quote("Se\xffoul"), "\"Se\xef\xbf\xbdoul\"");
 }
 
 TEST(AppEvents, LanguageKeyBecomesALanguageList)
