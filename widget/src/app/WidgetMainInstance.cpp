@@ -186,9 +186,6 @@ int WidgetMain::UpdateWidgetInstance(widget_context_h context, bundle*, int, voi
     if (!widgetViewControllerPtr)
         return WIDGET_ERROR_NOT_EXIST;
     widgetViewControllerPtr->Resume(true);
-    // Rebuilt pages leave freed pages inside the heap; without this the
-    // resident size creeps up with every update of a long-lived widget.
-    malloc_trim(0);
     return 0;
 }
 

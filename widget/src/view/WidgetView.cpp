@@ -1,7 +1,6 @@
 #include "WidgetView.h"
 
 #include <Elementary.h>
-#include <malloc.h>
 #include <elm_win_tizen.h>
 #include <widget_service.h>
 
@@ -393,9 +392,6 @@ int WidgetView::ShowNeighbourCity(bool toNext)
                                               : mWidgetViewDataPtr->GetPrevCityIndex());
     WIDGET_RETV_IF(!refilled, -1);
     PutPage(refilled, toNext ? kNextSlot : kPrevSlot);
-    // The page pushed out is freed: give its heap pages back, or the
-    // resident size creeps up flick after flick.
-    malloc_trim(0);
     return NSWeather::ERR_OK;
 }
 
