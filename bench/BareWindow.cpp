@@ -2,7 +2,9 @@
 // window of a 4x2 widget's size, on the buffer engine or, with a display,
 // as an X11 window titled "bare-window". Prints "drawn" after its first
 // frame, then, with --stay, waits for stdin to close (or SIGTERM) so that
-// its memory can be read.
+// its memory can be read. With --text it also shows one line of text: the
+// cost of the font machinery every widget with words pays and a bare window
+// does not.
 #include <Elementary.h>
 
 #include <unistd.h>
@@ -35,7 +37,12 @@ Eina_Bool StdinCb(void*, Ecore_Fd_Handler*)
 
 int main(int argc, char** argv)
 {
-    gStay = argc > 1 && strcmp(argv[1], "--stay") == 0;
+    bool withText = false;
+    for (int i = 1; i < argc; ++i)
+    {
+        gStay = gStay || strcmp(argv[i], "--stay") == 0;
+        withText = withText || strcmp(argv[i], "--text") == 0;
+    }
     // The same engine the host gives a widget without a display.
     if (!getenv("DISPLAY") && !getenv("WAYLAND_DISPLAY"))
         setenv("ELM_ENGINE", "buffer", 1);
@@ -46,6 +53,14 @@ int main(int argc, char** argv)
     Evas_Object* background = elm_bg_add(win);
     elm_win_resize_object_add(win, background);
     evas_object_show(background);
+    if (withText)
+    {
+        Evas_Object* label = elm_label_add(win);
+        elm_object_text_set(label, "Seoul 13°");
+        evas_object_move(label, 40, 40);
+        evas_object_resize(label, 400, 80);
+        evas_object_show(label);
+    }
     evas_object_resize(win, 712, 354);
     evas_event_callback_add(evas_object_evas_get(win), EVAS_CALLBACK_RENDER_POST, RenderPostCb, nullptr);
     evas_object_show(win);

@@ -17,6 +17,7 @@
 #include <chrono>
 #include <cstdlib>
 #include <fstream>
+#include <iterator>
 #include <sstream>
 #include <string>
 #include <thread>
@@ -249,27 +250,57 @@ BENCHMARK(BM_FlickToSlotsRotated)->Unit(benchmark::kMillisecond)->Iterations(3)-
 
 // Until the host answers, which it does once the instances named on its
 // command line exist with their pages.
+// Waits until the log gets `text` after byte `from`; false after 30 s.
+bool WaitForLogLine(const std::string& text, std::streamoff from)
+{
+    std::string seen;
+    for (int polls = 0; polls < 60000; ++polls)
+    {
+        std::ifstream log(gRoot + "/log/dlog.log", std::ios::binary);
+        log.seekg(from + static_cast<std::streamoff>(seen.size()));
+        seen.append(std::istreambuf_iterator<char>(log), std::istreambuf_iterator<char>());
+        if (seen.find(text) != std::string::npos)
+            return true;
+        std::this_thread::sleep_for(std::chrono::microseconds(500));
+    }
+    return false;
+}
+
+std::streamoff LogSize()
+{
+    std::ifstream log(gRoot + "/log/dlog.log", std::ios::binary | std::ios::ate);
+    return log ? static_cast<std::streamoff>(log.tellg()) : 0;
+}
+
+// To the host's line for the instance's first frame, as the floor is
+// measured to its first drawn frame.
 void BM_StartToFirstInstance(benchmark::State& state)
 {
     for (auto _ : state)
     {
+        std::streamoff from = LogSize();
         Clock::time_point start = Clock::now();
         Widget widget({"4x4"});
-        widget.Send("list");
+        if (!WaitForLogLine("drew its first frame", from))
+            state.SkipWithError("the instance did not draw");
         state.SetIterationTime(Seconds(start));
         state.counters["cpu_ms"] = CpuMs(widget.pid);
     }
 }
 BENCHMARK(BM_StartToFirstInstance)->Unit(benchmark::kMillisecond)->Iterations(1)->UseManualTime();
 
+// /0: the bare window; /1: the same with one line of text.
 void BM_StartToBareWindowDrawn(benchmark::State& state)
 {
+    std::vector<std::string> args = {BARE_WINDOW_PROGRAM, "--stay"};
+    if (state.range(0) != 0)
+        args.push_back("--text");
     for (auto _ : state)
     {
         Clock::time_point start = Clock::now();
         int in = -1;
         int out = -1;
-        pid_t pid = Spawn({BARE_WINDOW_PROGRAM, "--stay"}, &in, &out);
+        pid_t pid = Spawn(args, &in, &out);
         char buffer[16];
         if (read(out, buffer, sizeof(buffer)) <= 0)
             state.SkipWithError("bare window did not draw");
@@ -280,7 +311,12 @@ void BM_StartToBareWindowDrawn(benchmark::State& state)
         waitpid(pid, nullptr, 0);
     }
 }
-BENCHMARK(BM_StartToBareWindowDrawn)->Unit(benchmark::kMillisecond)->Iterations(1)->UseManualTime();
+BENCHMARK(BM_StartToBareWindowDrawn)
+    ->Arg(0)
+    ->Arg(1)
+    ->Unit(benchmark::kMillisecond)
+    ->Iterations(1)
+    ->UseManualTime();
 
 // Two instances (4x2 and 4x4) over ten cities once settled, beside the bare
 // window.

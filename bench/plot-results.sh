@@ -11,7 +11,7 @@ trap 'rm -f "$data"' EXIT
 # One row per subject: label, start-up ms, RSS MiB, PSS MiB ("-" when missing).
 awk -F'\t' '
     /^#/ { next }
-    { value[$1 "|" $2 "|" $3] = $4 }
+    { sub(/\/0$/, "", $2); value[$1 "|" $2 "|" $3] = $4 }
     function get(key, scale) { return (key in value) ? sprintf("%.1f", value[key] / scale) : "-" }
     function row(label, start, rss, pss) {
         printf "\"%s\"\t%s\t%s\t%s\n", label, get(start, 1), get(rss, 1024), get(pss, 1024)
@@ -19,6 +19,7 @@ awk -F'\t' '
     END {
         row("floor\\nbuffer", "headless|BM_StartToBareWindowDrawn|real_time",
             "headless|BM_MemoryTwoInstances|bare_rss_KiB", "headless|BM_MemoryTwoInstances|bare_pss_KiB")
+        row("floor + text\\nbuffer", "headless|BM_StartToBareWindowDrawn/1|real_time", "-", "-")
         row("widget\\nbuffer", "headless|BM_StartToFirstInstance|real_time",
             "headless|BM_MemoryTwoInstances|widget_rss_KiB", "headless|BM_MemoryTwoInstances|widget_pss_KiB")
         row("floor\\nX11", "x11|floor|mapped", "x11|floor|rss", "x11|floor|pss")

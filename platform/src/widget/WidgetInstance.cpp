@@ -39,6 +39,8 @@ WidgetInstance::~WidgetInstance()
 {
     if (mWindow)
     {
+        if (mIsWaitingForFirstFrame)
+            evas_event_callback_del_full(GetWindowCanvas(), EVAS_CALLBACK_RENDER_POST, FirstFrameCb, this);
         evas_object_event_callback_del_full(mWindow, EVAS_CALLBACK_DEL, WindowDelCb, this);
         evas_object_del(mWindow);
     }
@@ -121,7 +123,26 @@ Evas_Object* WidgetInstance::CreateWindow(const char* name)
     evas_object_intercept_resize_callback_add(mWindow, WindowResizeCb, nullptr);
     evas_object_event_callback_add(mWindow, EVAS_CALLBACK_DEL, WindowDelCb, this);
     evas_object_smart_callback_add(mWindow, "delete,request", CloseRequestCb, this);
+    evas_event_callback_add(GetWindowCanvas(), EVAS_CALLBACK_RENDER_POST, FirstFrameCb, this);
+    mIsWaitingForFirstFrame = true;
     return mWindow;
+}
+
+// The moment a user first sees the instance; start-up is measured to it.
+void WidgetInstance::FirstFrameCb(void* data, Evas* canvas, void* eventInfo)
+{
+    auto* post = static_cast<Evas_Event_Render_Post*>(eventInfo);
+    if (post && !post->updated_area)
+        return;
+    NSWeather::ForwardCallback<WidgetInstance>(
+        data,
+        [canvas](WidgetInstance& instance)
+        {
+            evas_event_callback_del_full(canvas, EVAS_CALLBACK_RENDER_POST, FirstFrameCb, &instance);
+            instance.mIsWaitingForFirstFrame = false;
+            dlog_print(DLOG_INFO, kLogTag, "instance %s drew its first frame", instance.mId.c_str());
+        },
+        PLATFORM_CALLBACK_SITE(kLogTag));
 }
 
 Evas* WidgetInstance::GetWindowCanvas() const
@@ -163,6 +184,8 @@ void WidgetInstance::CloseRequestCb(void* data, Evas_Object*, void*)
 
 void WidgetInstance::OnWindowDeleted()
 {
+    // The canvas and its callbacks went with the window.
+    mIsWaitingForFirstFrame = false;
     mWindow = nullptr;
 }
 

@@ -79,6 +79,7 @@ private:
     static void WindowDelCb(void* data, Evas* evas, Evas_Object* obj, void* eventInfo);
     static void ParentDelCb(void* data, Evas* evas, Evas_Object* obj, void* eventInfo);
     static void CloseRequestCb(void* data, Evas_Object* obj, void* eventInfo);
+    static void FirstFrameCb(void* data, Evas* evas, void* eventInfo);
     void OnWindowDeleted();
 
     std::string mId;
@@ -95,6 +96,7 @@ private:
     Ecore_Evas* mParentCanvas = nullptr;
     Evas_Object* mParentObject = nullptr;
     Evas_Object* mWindow = nullptr;
+    bool mIsWaitingForFirstFrame = false;
 };
 
 }  // namespace platform

@@ -4,6 +4,7 @@
 #include <elm_win_tizen.h>
 #include <widget_service.h>
 
+#include "ContentProvider.h"
 #include "ElementaryHelper.h"
 #include "TimeUtil.h"
 #include "WeatherDefine.h"
@@ -26,6 +27,8 @@ const char* const kNextSlot = "nextLayout";
 
 WidgetView::~WidgetView()
 {
+    if (mNeighbourIdler)
+        ecore_idler_del(mNeighbourIdler);
     mWidgetFlickControllerPtr.reset();
     mPrevPageControllerPtr.reset();
     mCenterPageControllerPtr.reset();
@@ -107,6 +110,7 @@ int WidgetView::OnGetNumberOfCities()
 
 void WidgetView::OnStartFlick(bool toNext)
 {
+    EnsureNeighbours();
     WidgetPageControllerPtr& incoming = toNext ? mNextPageControllerPtr : mPrevPageControllerPtr;
     if (incoming)
         incoming->UpdateRefreshButton(false);
@@ -116,6 +120,8 @@ WidgetPageControllerPtr WidgetView::CreatePage(Evas_Object* parent, int index)
 {
     WIDGET_RETV_IF(!parent, nullptr);
     WIDGET_RETV_IF(!mWidgetViewDataPtr, nullptr);
+    // Pages are also built from the idler and at the end of a slide.
+    NSWeather::ContentProvider::RebuildScope providerReadOnce;
     WidgetPageControllerPtr widgetPageControllerPtr;
     if (mWidgetViewDataPtr->GetSizeType() == WIDGET_SIZE_TYPE_4x4)
         widgetPageControllerPtr = std::make_shared<Widget4x4PageController>();
@@ -198,15 +204,47 @@ int WidgetView::AppendLayout(Evas_Object* parent)
     mCenterPageControllerPtr = CreatePage(parent, mWidgetViewDataPtr->GetIndexOfDisplayCity());
     WIDGET_RETV_IF(!mCenterPageControllerPtr, -1);
     PutPage(mCenterPageControllerPtr, kCenterSlot);
-    if (mWidgetViewDataPtr->GetNumberOfCities() < 2)
-        return NSWeather::ERR_OK;
-    mPrevPageControllerPtr = CreatePage(parent, mWidgetViewDataPtr->GetPrevCityIndex());
-    WIDGET_RETV_IF(mPrevPageControllerPtr == NULL, -1);
-    PutPage(mPrevPageControllerPtr, kPrevSlot);
-    mNextPageControllerPtr = CreatePage(parent, mWidgetViewDataPtr->GetNextCityIndex());
-    WIDGET_RETV_IF(mNextPageControllerPtr == NULL, -1);
-    PutPage(mNextPageControllerPtr, kNextSlot);
+    ScheduleNeighbours();
     return NSWeather::ERR_OK;
+}
+
+// An idler runs after the idle enterer that draws the frame.
+void WidgetView::ScheduleNeighbours()
+{
+    if (!mNeighbourIdler && mWidgetViewDataPtr && mWidgetViewDataPtr->GetNumberOfCities() >= 2)
+        mNeighbourIdler = ecore_idler_add(NeighbourIdlerCb, this);
+}
+
+Eina_Bool WidgetView::NeighbourIdlerCb(void* data)
+{
+    NSWeather::ForwardCallback<WidgetView>(
+        data,
+        [](WidgetView& self)
+        {
+            self.mNeighbourIdler = nullptr;
+            self.BuildMissingNeighbours();
+        },
+        WIDGET_CALLBACK_SITE);
+    return ECORE_CALLBACK_CANCEL;
+}
+
+void WidgetView::EnsureNeighbours()
+{
+    if (!mNeighbourIdler)
+        return;
+    ecore_idler_del(mNeighbourIdler);
+    mNeighbourIdler = nullptr;
+    BuildMissingNeighbours();
+}
+
+void WidgetView::BuildMissingNeighbours()
+{
+    if (!mBaseLayout || !mWidgetViewDataPtr || mWidgetViewDataPtr->GetNumberOfCities() < 2)
+        return;
+    if (!mPrevPageControllerPtr)
+        ResumeNeighbour(mPrevPageControllerPtr, kPrevSlot, mWidgetViewDataPtr->GetPrevCityIndex());
+    if (!mNextPageControllerPtr)
+        ResumeNeighbour(mNextPageControllerPtr, kNextSlot, mWidgetViewDataPtr->GetNextCityIndex());
 }
 
 // Follows the city the settings name, and rebuilds only when the indexes,
@@ -272,6 +310,8 @@ void WidgetView::Resume(bool forceUpdate)
         mNextPageControllerPtr.reset();
         return;
     }
+    if (mNeighbourIdler)
+        return;
     ResumeNeighbour(mPrevPageControllerPtr, kPrevSlot, data.GetPrevCityIndex());
     ResumeNeighbour(mNextPageControllerPtr, kNextSlot, data.GetNextCityIndex());
 }
@@ -301,6 +341,9 @@ void WidgetView::Pause()
 
 void WidgetView::Destroy()
 {
+    if (mNeighbourIdler)
+        ecore_idler_del(mNeighbourIdler);
+    mNeighbourIdler = nullptr;
     if (mChangeableThemePtr)
         mChangeableThemePtr->DeinitChangeableTheme();
     for (auto* controller : {&mCenterPageControllerPtr, &mPrevPageControllerPtr, &mNextPageControllerPtr})

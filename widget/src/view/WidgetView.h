@@ -1,6 +1,7 @@
 #ifndef NSWEATHERWIDGET_WIDGET_VIEW_H
 #define NSWEATHERWIDGET_WIDGET_VIEW_H
 
+#include <Ecore.h>
 #include <Evas.h>
 
 #include <memory>
@@ -58,6 +59,12 @@ public:
 
 private:
     bool BuildPages();
+    // Neighbour pages are off-screen: they are built once the first frame
+    // is out, or at once when something needs them before that.
+    void ScheduleNeighbours();
+    void EnsureNeighbours();
+    void BuildMissingNeighbours();
+    static Eina_Bool NeighbourIdlerCb(void* data);
     void CreateFlickController();
     void PutPage(const WidgetPageControllerPtr& controller, const char* slot);
     // Keeps or creates the neighbour page of `slot` for the city at `index`.
@@ -69,6 +76,7 @@ private:
     static void WindowDelCb(void* data, Evas* evas, Evas_Object* obj, void* eventInfo);
 
     Evas_Object* mWin = nullptr;
+    Ecore_Idler* mNeighbourIdler = nullptr;
     Evas_Object* mBaseLayout = nullptr;
     WidgetPageControllerPtr mPrevPageControllerPtr;
     WidgetPageControllerPtr mCenterPageControllerPtr;

@@ -37,10 +37,13 @@ public:
 
     void StartHost(const std::vector<std::string>& sizes);
     std::string Send(const std::string& command);
+    // Single-line replies of `commands`, sent on a connection of their own.
+    std::vector<std::string> SendInOneWrite(const std::vector<std::string>& commands);
     std::string Id(int n) const { return std::string(kWidgetId) + ":" + std::to_string(n); }
     void WaitIdle();
     // The JSON of one page slot ("centerLayout" ...) of an instance's dump.
     std::string Slot(const std::string& id, const std::string& slot);
+    static std::string SlotOf(const std::string& dump, const std::string& slot);
     // The text of `part` in the centre page of an instance ("" if none).
     std::string CentreText(const std::string& id, const std::string& part);
     std::vector<std::string> Launches() const;

@@ -98,3 +98,31 @@ TEST_F(WidgetViewResumeTest, UpdatedPageShowsOnlyTheNewDays)
 }
 
 }  // namespace WeatherTest
+
+namespace WeatherTest
+{
+
+// Neighbour pages are off-screen: they come once the first frame is out;
+// an instance that goes before that takes their pending build with it.
+TEST_F(WidgetViewResumeTest, NeighbourPagesFollowTheFirstFrame)
+{
+    std::vector<std::string> replies =
+        SendInOneWrite({"create 4x2", "dump " + Id(2), "create 4x4", "destroy " + Id(3)});
+    ASSERT_EQ(replies.size(), 4u);
+    EXPECT_EQ(replies[0], "OK " + Id(2));
+    EXPECT_NE(SlotOf(replies[1], "centerLayout"), "");
+    for (const char* slot : {"prevLayout", "nextLayout"}) EXPECT_EQ(SlotOf(replies[1], slot), "") << slot;
+    EXPECT_EQ(replies[3], "OK");
+    WaitIdle();
+    EXPECT_NE(Slot(Id(2), "prevLayout").find("San Francisco"), std::string::npos);
+    EXPECT_NE(Slot(Id(2), "nextLayout").find("Reykjavík"), std::string::npos);
+    EXPECT_EQ(CountLog("drew its first frame"), 2);
+    // A flick before the first frame builds them on the spot.
+    replies = SendInOneWrite({"create 4x2", "swipe " + Id(4) + " 300 300 300 50 120"});
+    ASSERT_EQ(replies.size(), 2u);
+    EXPECT_EQ(replies[1].compare(0, 3, "OK "), 0) << replies[1];
+    WaitIdle();
+    EXPECT_EQ(CentreText(Id(4), "name"), "Reykjavík");
+}
+
+}  // namespace WeatherTest
