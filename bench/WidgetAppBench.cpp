@@ -112,12 +112,55 @@ struct Widget
     }
 };
 
-int CountUpdates()
+// The widget's log from now on, in whole lines, followed through its
+// rotation to "dlog.log.1".
+class LogTail
 {
-    std::ifstream log(gRoot + "/log/dlog.log");
-    std::string line;
+public:
+    LogTail() : mOffset(Size(Path())) {}
+
+    // The lines written since the last call.
+    std::string Read()
+    {
+        if (Size(Path()) < mOffset)
+        {
+            mPending += ReadFrom(Path() + ".1", mOffset);
+            mOffset = 0;
+        }
+        std::string text = ReadFrom(Path(), mOffset);
+        mOffset += static_cast<std::streamoff>(text.size());
+        mPending += text;
+        size_t end = mPending.rfind('\n');
+        if (end == std::string::npos)
+            return std::string();
+        std::string lines = mPending.substr(0, end + 1);
+        mPending.erase(0, end + 1);
+        return lines;
+    }
+
+private:
+    static std::string Path() { return gRoot + "/log/dlog.log"; }
+    static std::streamoff Size(const std::string& path)
+    {
+        std::ifstream file(path, std::ios::binary | std::ios::ate);
+        return file ? static_cast<std::streamoff>(file.tellg()) : 0;
+    }
+    static std::string ReadFrom(const std::string& path, std::streamoff offset)
+    {
+        std::ifstream file(path, std::ios::binary);
+        file.seekg(offset);
+        return std::string(std::istreambuf_iterator<char>(file), std::istreambuf_iterator<char>());
+    }
+
+    std::streamoff mOffset;
+    std::string mPending;
+};
+
+int CountLines(const std::string& lines, const std::string& text)
+{
     int count = 0;
-    while (std::getline(log, line)) count += line.find("UpdateWidgetInstance") != std::string::npos;
+    for (size_t at = lines.find(text); at != std::string::npos; at = lines.find(text, at + text.size()))
+        ++count;
     return count;
 }
 
@@ -193,13 +236,18 @@ void BM_PortMessageToEveryInstanceUpdated(benchmark::State& state)
     widget.Send("idle 10");
     for (auto _ : state)
     {
-        int target = CountUpdates() + 4;  // two rounds for two instances
+        LogTail log;
         bundle* message = bundle_create();
         message_port_send_message(kWidgetId, kPort, message);
         bundle_free(message);
         // Each reply comes after the widget's loop has handled what was
-        // queued before it, updates included.
-        while (CountUpdates() < target) widget.Send("list");
+        // queued before it, updates included. Two rounds for two instances.
+        for (int updates = 0; updates < 4;)
+        {
+            updates += CountLines(log.Read(), "UpdateWidgetInstance");
+            if (updates < 4)
+                widget.Send("list");
+        }
         widget.Send("list");
     }
 }
@@ -248,28 +296,16 @@ void BM_FlickToSlotsRotated(benchmark::State& state)
 }
 BENCHMARK(BM_FlickToSlotsRotated)->Unit(benchmark::kMillisecond)->Iterations(3)->UseManualTime();
 
-// Until the host answers, which it does once the instances named on its
-// command line exist with their pages.
-// Waits until the log gets `text` after byte `from`; false after 30 s.
-bool WaitForLogLine(const std::string& text, std::streamoff from)
+// Waits until the log gets a line with `text`; false after 30 s.
+bool WaitForLogLine(LogTail& log, const std::string& text)
 {
-    std::string seen;
     for (int polls = 0; polls < 60000; ++polls)
     {
-        std::ifstream log(gRoot + "/log/dlog.log", std::ios::binary);
-        log.seekg(from + static_cast<std::streamoff>(seen.size()));
-        seen.append(std::istreambuf_iterator<char>(log), std::istreambuf_iterator<char>());
-        if (seen.find(text) != std::string::npos)
+        if (log.Read().find(text) != std::string::npos)
             return true;
         std::this_thread::sleep_for(std::chrono::microseconds(500));
     }
     return false;
-}
-
-std::streamoff LogSize()
-{
-    std::ifstream log(gRoot + "/log/dlog.log", std::ios::binary | std::ios::ate);
-    return log ? static_cast<std::streamoff>(log.tellg()) : 0;
 }
 
 // To the host's line for the instance's first frame, as the floor is
@@ -278,10 +314,10 @@ void BM_StartToFirstInstance(benchmark::State& state)
 {
     for (auto _ : state)
     {
-        std::streamoff from = LogSize();
+        LogTail log;
         Clock::time_point start = Clock::now();
         Widget widget({"4x4"});
-        if (!WaitForLogLine("drew its first frame", from))
+        if (!WaitForLogLine(log, "drew its first frame"))
             state.SkipWithError("the instance did not draw");
         state.SetIterationTime(Seconds(start));
         state.counters["cpu_ms"] = CpuMs(widget.pid);
