@@ -1,7 +1,7 @@
 // The widget program as the host runs it, measured from outside: a port
 // message until every instance has been updated, one flick until the slide
 // has ended and the slots have turned, process start until the first
-// instance exists beside a bare Elementary window's first frame, and memory
+// instance has drawn its first frame beside a bare Elementary window's, and memory
 // (RSS and PSS) with two instances, settled and after flicks and updates,
 // beside that window's. WIDGET_BENCH_FLICKS sets the number of flicks of the
 // last one (1000).
