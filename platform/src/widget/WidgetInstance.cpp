@@ -119,6 +119,9 @@ Evas_Object* WidgetInstance::CreateWindow(const char* name)
         return nullptr;
     }
     elm_win_title_set(mWindow, mId.c_str());
+    // As on the phone, the home screen shows through where the widget draws
+    // nothing; an opaque window kept a slide's pixels in the page corners.
+    elm_win_alpha_set(mWindow, EINA_TRUE);
     evas_object_resize(mWindow, mWidth, mHeight);
     evas_object_intercept_resize_callback_add(mWindow, WindowResizeCb, nullptr);
     evas_object_event_callback_add(mWindow, EVAS_CALLBACK_DEL, WindowDelCb, this);
