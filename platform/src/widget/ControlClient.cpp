@@ -75,13 +75,37 @@ bool ControlClient::ReadLine(std::string& line, double deadline)
     }
 }
 
+// All of `commands` in one send: a host reads them together and handles
+// them one after the other before its loop turns again.
+bool ControlClient::SendCommands(const std::vector<std::string>& commands)
+{
+    std::string lines;
+    for (const std::string& command : commands)
+    {
+        if (command.find('\n') != std::string::npos)
+            return false;
+        lines += command + "\n";
+    }
+    return mFd >= 0 &&
+           send(mFd, lines.data(), lines.size(), MSG_NOSIGNAL) == static_cast<ssize_t>(lines.size());
+}
+
+bool ControlClient::RequestTogether(const std::vector<std::string>& commands,
+                                    std::vector<std::string>& replies, double timeoutSeconds)
+{
+    replies.clear();
+    if (!SendCommands(commands))
+        return false;
+    double deadline = Now() + timeoutSeconds;
+    std::string reply;
+    while (replies.size() < commands.size() && ReadLine(reply, deadline)) replies.push_back(reply);
+    return replies.size() == commands.size();
+}
+
 bool ControlClient::Request(const std::string& command, std::string& reply, double timeoutSeconds)
 {
     reply.clear();
-    if (mFd < 0 || command.find('\n') != std::string::npos)
-        return false;
-    std::string line = command + "\n";
-    if (send(mFd, line.data(), line.size(), MSG_NOSIGNAL) != static_cast<ssize_t>(line.size()))
+    if (!SendCommands({command}))
         return false;
     double deadline = Now() + timeoutSeconds;
     if (!ReadLine(reply, deadline))

@@ -2,6 +2,7 @@
 #define PLATFORM_WIDGET_CONTROL_CLIENT_H
 
 #include <string>
+#include <vector>
 
 namespace platform
 {
@@ -26,8 +27,13 @@ public:
     // line and the n lines after it, joined with '\n'). False when the host
     // is gone or did not answer within `timeoutSeconds`.
     bool Request(const std::string& command, std::string& reply, double timeoutSeconds = 30.0);
+    // Sends `commands` in one write, so that the host handles them without
+    // drawing in between, and reads one reply line each (not for list).
+    bool RequestTogether(const std::vector<std::string>& commands, std::vector<std::string>& replies,
+                         double timeoutSeconds = 30.0);
 
 private:
+    bool SendCommands(const std::vector<std::string>& commands);
     bool ReadLine(std::string& line, double deadline);
 
     int mFd = -1;

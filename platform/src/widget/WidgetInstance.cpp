@@ -39,8 +39,8 @@ WidgetInstance::~WidgetInstance()
 {
     if (mWindow)
     {
-        if (mIsWaitingForFirstFrame)
-            evas_event_callback_del_full(GetWindowCanvas(), EVAS_CALLBACK_RENDER_POST, FirstFrameCb, this);
+        // Nothing when the first frame already took it away.
+        evas_event_callback_del_full(GetWindowCanvas(), EVAS_CALLBACK_RENDER_POST, FirstFrameCb, this);
         evas_object_event_callback_del_full(mWindow, EVAS_CALLBACK_DEL, WindowDelCb, this);
         evas_object_del(mWindow);
     }
@@ -127,7 +127,6 @@ Evas_Object* WidgetInstance::CreateWindow(const char* name)
     evas_object_event_callback_add(mWindow, EVAS_CALLBACK_DEL, WindowDelCb, this);
     evas_object_smart_callback_add(mWindow, "delete,request", CloseRequestCb, this);
     evas_event_callback_add(GetWindowCanvas(), EVAS_CALLBACK_RENDER_POST, FirstFrameCb, this);
-    mIsWaitingForFirstFrame = true;
     return mWindow;
 }
 
@@ -142,7 +141,6 @@ void WidgetInstance::FirstFrameCb(void* data, Evas* canvas, void* eventInfo)
         [canvas](WidgetInstance& instance)
         {
             evas_event_callback_del_full(canvas, EVAS_CALLBACK_RENDER_POST, FirstFrameCb, &instance);
-            instance.mIsWaitingForFirstFrame = false;
             dlog_print(DLOG_INFO, kLogTag, "instance %s drew its first frame", instance.mId.c_str());
         },
         PLATFORM_CALLBACK_SITE(kLogTag));
@@ -187,8 +185,6 @@ void WidgetInstance::CloseRequestCb(void* data, Evas_Object*, void*)
 
 void WidgetInstance::OnWindowDeleted()
 {
-    // The canvas and its callbacks went with the window.
-    mIsWaitingForFirstFrame = false;
     mWindow = nullptr;
 }
 

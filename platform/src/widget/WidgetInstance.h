@@ -96,7 +96,6 @@ private:
     Ecore_Evas* mParentCanvas = nullptr;
     Evas_Object* mParentObject = nullptr;
     Evas_Object* mWindow = nullptr;
-    bool mIsWaitingForFirstFrame = false;
 };
 
 }  // namespace platform

@@ -27,8 +27,7 @@ const char* const kNextSlot = "nextLayout";
 
 WidgetView::~WidgetView()
 {
-    if (mNeighbourIdler)
-        ecore_idler_del(mNeighbourIdler);
+    CancelNeighbours();
     mWidgetFlickControllerPtr.reset();
     mPrevPageControllerPtr.reset();
     mCenterPageControllerPtr.reset();
@@ -228,13 +227,19 @@ Eina_Bool WidgetView::NeighbourIdlerCb(void* data)
     return ECORE_CALLBACK_CANCEL;
 }
 
-void WidgetView::EnsureNeighbours()
+bool WidgetView::CancelNeighbours()
 {
     if (!mNeighbourIdler)
-        return;
+        return false;
     ecore_idler_del(mNeighbourIdler);
     mNeighbourIdler = nullptr;
-    BuildMissingNeighbours();
+    return true;
+}
+
+void WidgetView::EnsureNeighbours()
+{
+    if (CancelNeighbours())
+        BuildMissingNeighbours();
 }
 
 void WidgetView::BuildMissingNeighbours()
@@ -341,9 +346,7 @@ void WidgetView::Pause()
 
 void WidgetView::Destroy()
 {
-    if (mNeighbourIdler)
-        ecore_idler_del(mNeighbourIdler);
-    mNeighbourIdler = nullptr;
+    CancelNeighbours();
     if (mChangeableThemePtr)
         mChangeableThemePtr->DeinitChangeableTheme();
     for (auto* controller : {&mCenterPageControllerPtr, &mPrevPageControllerPtr, &mNextPageControllerPtr})

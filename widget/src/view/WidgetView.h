@@ -62,6 +62,8 @@ private:
     // Neighbour pages are off-screen: they are built once the first frame
     // is out, or at once when something needs them before that.
     void ScheduleNeighbours();
+    // True when a build was pending.
+    bool CancelNeighbours();
     void EnsureNeighbours();
     void BuildMissingNeighbours();
     static Eina_Bool NeighbourIdlerCb(void* data);

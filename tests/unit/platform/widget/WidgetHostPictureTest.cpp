@@ -1,10 +1,9 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <Ecore_Evas.h>
-
 #include <set>
 
+#include "TestPicture.h"
 #include "WidgetHostFixture.h"
 
 using ::testing::HasSubstr;
@@ -14,29 +13,9 @@ namespace WeatherTest
 
 namespace
 {
-struct Picture
+std::set<uint32_t> ColoursOf(const TestPicture& picture)
 {
-    int width = 0;
-    int height = 0;
-    std::set<unsigned> colours;
-};
-
-Picture Load(const std::string& path)
-{
-    Picture picture;
-    ecore_evas_init();
-    Ecore_Evas* canvas = ecore_evas_buffer_new(1, 1);
-    Evas_Object* image = evas_object_image_add(ecore_evas_get(canvas));
-    evas_object_image_file_set(image, path.c_str(), nullptr);
-    if (evas_object_image_load_error_get(image) == EVAS_LOAD_ERROR_NONE)
-    {
-        evas_object_image_size_get(image, &picture.width, &picture.height);
-        auto* pixels = static_cast<const unsigned*>(evas_object_image_data_get(image, EINA_FALSE));
-        for (int i = 0; pixels && i < picture.width * picture.height; ++i) picture.colours.insert(pixels[i]);
-    }
-    ecore_evas_free(canvas);
-    ecore_evas_shutdown();
-    return picture;
+    return std::set<uint32_t>(picture.pixels.begin(), picture.pixels.end());
 }
 }  // namespace
 
@@ -46,17 +25,17 @@ TEST_F(WidgetHostTest, SnapshotWritesAPictureOfTheInstanceSize)
     std::string id = CreateInstance("4x2");
     std::string file = mRoot.Path("wide.png");
     EXPECT_EQ(Send("snapshot " + id + " " + file), "OK " + file + " 712x354");
-    Picture wide = Load(file);
+    TestPicture wide = TestPicture::Load(file);
     EXPECT_EQ(wide.width, 712);
     EXPECT_EQ(wide.height, 354);
-    EXPECT_GE(wide.colours.size(), 3u) << "background, block and text should all show";
+    EXPECT_GE(ColoursOf(wide).size(), 3u) << "background, block and text should all show";
     // The background colour of the test widget is there.
-    EXPECT_EQ(wide.colours.count(0xff143ca0u), 1u);
+    EXPECT_EQ(ColoursOf(wide).count(0xff143ca0u), 1u);
 
     ASSERT_EQ(Send("resize " + id + " 4x4"), "OK");
     std::string square = mRoot.Path("square.png");
     EXPECT_EQ(Send("snapshot " + id + " " + square), "OK " + square + " 712x712");
-    EXPECT_EQ(Load(square).height, 712);
+    EXPECT_EQ(TestPicture::Load(square).height, 712);
 }
 
 TEST_F(WidgetHostTest, OnADisplayWindowsAreDrawnAndPicturedToo)
@@ -72,11 +51,11 @@ TEST_F(WidgetHostTest, OnADisplayWindowsAreDrawnAndPicturedToo)
     WaitIdle();
     std::string file = mRoot.Path("display.png");
     EXPECT_EQ(Send("snapshot " + square + " " + file), "OK " + file + " 712x712");
-    Picture picture = Load(file);
+    TestPicture picture = TestPicture::Load(file);
     EXPECT_EQ(picture.width, 712);
     EXPECT_EQ(picture.height, 712);
-    EXPECT_EQ(picture.colours.count(0xff143ca0u), 1u);
-    EXPECT_GE(picture.colours.size(), 3u);
+    EXPECT_EQ(ColoursOf(picture).count(0xff143ca0u), 1u);
+    EXPECT_GE(ColoursOf(picture).size(), 3u);
 }
 
 TEST_F(WidgetHostTest, SnapshotToAnUnwritablePlaceIsAnError)

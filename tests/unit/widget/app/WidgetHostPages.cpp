@@ -1,9 +1,6 @@
 #include "WidgetHostPages.h"
 
 #include <fcntl.h>
-#include <poll.h>
-#include <sys/socket.h>
-#include <sys/un.h>
 #include <sys/wait.h>
 #include <unistd.h>
 #include <vconf.h>
@@ -129,42 +126,10 @@ std::string WidgetHostPagesTest::Send(const std::string& command)
     return mClient.Request(command, reply, 30.0) ? reply : std::string();
 }
 
-// One write, so the host handles every line before its loop turns again.
-std::vector<std::string> WidgetHostPagesTest::SendInOneWrite(const std::vector<std::string>& commands)
+std::vector<std::string> WidgetHostPagesTest::SendTogether(const std::vector<std::string>& commands)
 {
     std::vector<std::string> replies;
-    std::string socketPath = platform::ControlClient::SocketPath(kWidgetId);
-    sockaddr_un address = {};
-    address.sun_family = AF_UNIX;
-    if (socketPath.size() >= sizeof(address.sun_path))
-        return replies;
-    socketPath.copy(address.sun_path, socketPath.size());
-    int fd = socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0);
-    std::string batch;
-    for (const std::string& command : commands) batch += command + "\n";
-    if (fd < 0 || connect(fd, reinterpret_cast<sockaddr*>(&address), sizeof(address)) != 0 ||
-        send(fd, batch.data(), batch.size(), MSG_NOSIGNAL) != static_cast<ssize_t>(batch.size()))
-    {
-        if (fd >= 0)
-            close(fd);
-        return replies;
-    }
-    std::string input;
-    pollfd waiter = {fd, POLLIN, 0};
-    char buffer[65536];
-    while (replies.size() < commands.size() && poll(&waiter, 1, 30000) > 0)
-    {
-        ssize_t got = read(fd, buffer, sizeof(buffer));
-        if (got <= 0)
-            break;
-        input.append(buffer, static_cast<size_t>(got));
-        for (size_t end; replies.size() < commands.size() && (end = input.find('\n')) != std::string::npos;)
-        {
-            replies.push_back(input.substr(0, end));
-            input.erase(0, end + 1);
-        }
-    }
-    close(fd);
+    mClient.RequestTogether(commands, replies, 30.0);
     return replies;
 }
 

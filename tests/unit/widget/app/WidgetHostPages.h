@@ -37,8 +37,8 @@ public:
 
     void StartHost(const std::vector<std::string>& sizes);
     std::string Send(const std::string& command);
-    // Single-line replies of `commands`, sent on a connection of their own.
-    std::vector<std::string> SendInOneWrite(const std::vector<std::string>& commands);
+    // One write: the host handles all of them before it draws again.
+    std::vector<std::string> SendTogether(const std::vector<std::string>& commands);
     std::string Id(int n) const { return std::string(kWidgetId) + ":" + std::to_string(n); }
     void WaitIdle();
     // The JSON of one page slot ("centerLayout" ...) of an instance's dump.

@@ -1,13 +1,13 @@
 // Vertical swipes fed through the host move between cities.
 #include <gtest/gtest.h>
 
-#include <Ecore_Evas.h>
 #include <vconf.h>
 
 #include <cstdlib>
 
 #include "FileUtil.h"
 #include "TestDB.h"
+#include "TestPicture.h"
 #include "WidgetHostPages.h"
 
 namespace WeatherTest
@@ -39,24 +39,6 @@ const SwipeCase kSwipeCases[] = {
     {"DiagonalIsLeftToTheHomeScreen", 3, -150, 151, 200, 0},
     {"OneCityDoesNotFlick", 1, -150, 0, 200, 0},
 };
-// The ARGB pixel at (x, y) of a picture, or 1 when it cannot be read.
-unsigned PixelOf(const std::string& path, int x, int y)
-{
-    unsigned pixel = 1;
-    ecore_evas_init();
-    Ecore_Evas* canvas = ecore_evas_buffer_new(1, 1);
-    Evas_Object* image = evas_object_image_add(ecore_evas_get(canvas));
-    evas_object_image_file_set(image, path.c_str(), nullptr);
-    int width = 0;
-    int height = 0;
-    evas_object_image_size_get(image, &width, &height);
-    auto* pixels = static_cast<const unsigned*>(evas_object_image_data_get(image, EINA_FALSE));
-    if (pixels && x < width && y < height)
-        pixel = pixels[y * width + x];
-    ecore_evas_free(canvas);
-    ecore_evas_shutdown();
-    return pixel;
-}
 }  // namespace
 
 class WidgetFlickTest : public WidgetHostPagesTest
@@ -117,8 +99,9 @@ TEST_F(WidgetFlickTest, FlickFromLastWrapsToFirstAndStoresTheCity)
     // The slide leaves nothing behind the page's rounded corners.
     std::string picture = mRoot.Path("after-flick.png");
     ASSERT_EQ(Send("snapshot " + Id(1) + " " + picture).compare(0, 2, "OK"), 0);
-    EXPECT_EQ(PixelOf(picture, 1, 1) >> 24, 0u);
-    EXPECT_EQ(PixelOf(picture, 356, 177) >> 24, 0xffu);
+    TestPicture after = TestPicture::Load(picture);
+    EXPECT_EQ(after.At(1, 1) >> 24, 0u);
+    EXPECT_EQ(after.At(356, 177) >> 24, 0xffu);
 }
 
 // One slide at a time in the whole process, and exactly one rotation each.

@@ -107,7 +107,7 @@ namespace WeatherTest
 TEST_F(WidgetViewResumeTest, NeighbourPagesFollowTheFirstFrame)
 {
     std::vector<std::string> replies =
-        SendInOneWrite({"create 4x2", "dump " + Id(2), "create 4x4", "destroy " + Id(3)});
+        SendTogether({"create 4x2", "dump " + Id(2), "create 4x4", "destroy " + Id(3)});
     ASSERT_EQ(replies.size(), 4u);
     EXPECT_EQ(replies[0], "OK " + Id(2));
     EXPECT_NE(SlotOf(replies[1], "centerLayout"), "");
@@ -118,7 +118,7 @@ TEST_F(WidgetViewResumeTest, NeighbourPagesFollowTheFirstFrame)
     EXPECT_NE(Slot(Id(2), "nextLayout").find("Reykjavík"), std::string::npos);
     EXPECT_EQ(CountLog("drew its first frame"), 2);
     // A flick before the first frame builds them on the spot.
-    replies = SendInOneWrite({"create 4x2", "swipe " + Id(4) + " 300 300 300 50 120"});
+    replies = SendTogether({"create 4x2", "swipe " + Id(4) + " 300 300 300 50 120"});
     ASSERT_EQ(replies.size(), 2u);
     EXPECT_EQ(replies[1].compare(0, 3, "OK "), 0) << replies[1];
     WaitIdle();
